@@ -1,0 +1,42 @@
+// The HulCvTools demo: boots the library against an option value storage, runs each
+// subsystem's section and shuts down, all under a counting memory controller that must
+// get every block back.
+#include "DemoSections.h"
+
+#include "HulCvTools/Control/KvCCvToolsControl.h"
+#include "platform/support/KvCCountingMemController.h"
+#include "platform/support/KvCOptionValueStorage.h"
+
+#include <iostream>
+
+void printSectionTitle(std::ostream& out, const char* title) {
+  out << "\n== " << title << " ==\n";
+}
+
+int main() {
+  std::ostream& out = std::cout;
+  out << "HulCvTools demo\n";
+
+  KvCCountingMemController memory;
+  pKVMemory = &memory;
+  KvCOptionValueStorage storage;
+  auto* control = new KvCCvToolsControl;
+  if (!control) {
+    pKVMemory = nullptr;
+    out << "out of memory\n";
+    return 1;
+  }
+  out << "boot: " << (control->boot(&storage) ? "ok" : "failed") << "\n";
+
+  DemoRun run{out, storage, *control};
+  demoControl(run);
+
+  printSectionTitle(out, "Shutdown");
+  out << "shutdown: " << (control->shutdown() ? "ok" : "failed") << "\n";
+  out << "blocks taken from the memory controller: " << memory.getTotalBlocks() << "\n";
+  delete control;
+  pKVMemory = nullptr;
+  out << "blocks still outstanding after destruction: " << memory.getOutstandingBlocks()
+      << "\n";
+  return memory.getOutstandingBlocks() == 0 ? 0 : 1;
+}

@@ -1,0 +1,24 @@
+// The demo's sections, one per subsystem of the library. Each section runs the
+// subsystem's passes on the demo's run state and prints what they found. Output must be
+// the same on every run: print no addresses and nothing that depends on hash order.
+#ifndef HULCV_EXAMPLES_DEMOSECTIONS_H
+#define HULCV_EXAMPLES_DEMOSECTIONS_H
+
+#include <ostream>
+
+class KvCCvToolsControl;
+class KvCOptionValueStorage;
+
+// What the sections share: the booted control object and the run's option storage.
+struct DemoRun {
+  std::ostream& out;
+  KvCOptionValueStorage& storage;
+  KvCCvToolsControl& control;
+};
+
+void printSectionTitle(std::ostream& out, const char* title);
+
+// Library frame: options, messages, internal checks.
+void demoControl(DemoRun& run);
+
+#endif
