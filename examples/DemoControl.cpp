@@ -31,11 +31,11 @@ KindCounts countOptionKinds() {
 void showRegistration(DemoRun& run, KvCCvToolsOptionsInterface& options) {
   const int id = options.getInterfaceId();
   const KindCounts k = countOptionKinds();
-  run.out << "options registered: " << run.storage.getNumberOfOptions(id)
-          << " under interface id " << id << "\n"
+  run.out << "options registered: " << run.storage.getNumberOfOptions(id) << " under interface id "
+          << id << "\n"
           << "  by type: " << k.Bool << " bool, " << k.Int << " int, " << k.UInt
-          << " unsigned int, " << k.Double << " double, " << k.String << " string, "
-          << k.MxArray << " matrix\n";
+          << " unsigned int, " << k.Double << " double, " << k.String << " string, " << k.MxArray
+          << " matrix\n";
 }
 
 void showOptionsDump(DemoRun& run, KvCCvToolsOptionsInterface& options) {

@@ -9,9 +9,7 @@
 
 #include <iostream>
 
-void printSectionTitle(std::ostream& out, const char* title) {
-  out << "\n== " << title << " ==\n";
-}
+void printSectionTitle(std::ostream& out, const char* title) { out << "\n== " << title << " ==\n"; }
 
 int main() {
   std::ostream& out = std::cout;
@@ -36,7 +34,6 @@ int main() {
   out << "blocks taken from the memory controller: " << memory.getTotalBlocks() << "\n";
   delete control;
   pKVMemory = nullptr;
-  out << "blocks still outstanding after destruction: " << memory.getOutstandingBlocks()
-      << "\n";
+  out << "blocks still outstanding after destruction: " << memory.getOutstandingBlocks() << "\n";
   return memory.getOutstandingBlocks() == 0 ? 0 : 1;
 }

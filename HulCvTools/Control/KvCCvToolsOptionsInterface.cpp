@@ -77,14 +77,14 @@ KV_Dump* KvCCvToolsOptionsInterface::dumpContents(KV_Dump* dump, bool /*deep*/) 
 #define HULCV_STORAGE_GET_String getStringOptionValueByEncodedName
 #define HULCV_STORAGE_GET_MxArray getMXArrayOptionValueByEncodedName
 
-#define HULCV_OPTION(Kind, Name)                                                               \
-  HULCV_OPTION_GET_TYPE_##Kind KvCCvToolsOptionsInterface::get##Name() const {                 \
-    if (!storage)                                                                              \
-      return {};                                                                               \
-    return storage->HULCV_STORAGE_GET_##Kind(interfaceId, getter_names::Name.text);            \
-  }                                                                                            \
-  bool KvCCvToolsOptionsInterface::set##Name(HULCV_OPTION_SET_TYPE_##Kind value) {             \
-    return storage && storage->setOptionValueByEncodedName(interfaceId,                        \
-                                                           setter_names::Name.text, value);    \
+#define HULCV_OPTION(Kind, Name)                                                                   \
+  HULCV_OPTION_GET_TYPE_##Kind KvCCvToolsOptionsInterface::get##Name() const {                     \
+    if (!storage)                                                                                  \
+      return {};                                                                                   \
+    return storage->HULCV_STORAGE_GET_##Kind(interfaceId, getter_names::Name.text);                \
+  }                                                                                                \
+  bool KvCCvToolsOptionsInterface::set##Name(HULCV_OPTION_SET_TYPE_##Kind value) {                 \
+    return storage &&                                                                              \
+           storage->setOptionValueByEncodedName(interfaceId, setter_names::Name.text, value);      \
   }
 #include "HulCvTools/Control/KvCCvToolsOptions.def"

@@ -59,8 +59,8 @@ public:
   // A block "KvCCvToolsOptionsInterface" holding the storage's dump of the options.
   KV_Dump* dumpContents(KV_Dump* dump, bool deep) const override;
 
-#define HULCV_OPTION(Kind, Name)                                                               \
-  HULCV_OPTION_GET_TYPE_##Kind get##Name() const;                                              \
+#define HULCV_OPTION(Kind, Name)                                                                   \
+  HULCV_OPTION_GET_TYPE_##Kind get##Name() const;                                                  \
   bool set##Name(HULCV_OPTION_SET_TYPE_##Kind value);
 #include "HulCvTools/Control/KvCCvToolsOptions.def"
 

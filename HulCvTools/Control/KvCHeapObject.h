@@ -20,14 +20,14 @@ void* allocObject(std::size_t size) noexcept;
 void freeObject(void* object) noexcept;
 } // namespace hulcv_detail
 
-#define HULCV_HEAP_OPERATORS                                                                   \
-  static void* operator new(std::size_t size) noexcept;                                        \
+#define HULCV_HEAP_OPERATORS                                                                       \
+  static void* operator new(std::size_t size) noexcept;                                            \
   static void operator delete(void* object) noexcept;
 
-#define HULCV_DEFINE_HEAP_OPERATORS(Class)                                                     \
-  void* Class::operator new(std::size_t size) noexcept {                                       \
-    return ::hulcv_detail::allocObject(size);                                                  \
-  }                                                                                            \
+#define HULCV_DEFINE_HEAP_OPERATORS(Class)                                                         \
+  void* Class::operator new(std::size_t size) noexcept {                                           \
+    return ::hulcv_detail::allocObject(size);                                                      \
+  }                                                                                                \
   void Class::operator delete(void* object) noexcept { ::hulcv_detail::freeObject(object); }
 
 #endif

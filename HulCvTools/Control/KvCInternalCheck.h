@@ -33,19 +33,19 @@ private:
 };
 
 // Reports a failed internal check with the error code text and number.
-#define KV_INTERNAL_CHECK(errorCode, number)                                                   \
+#define KV_INTERNAL_CHECK(errorCode, number)                                                       \
   KvCInternalCheck::report(__FILE__, __LINE__, (errorCode), (number))
-#define KV_INTERNAL_CHECK_SRC(srcRef, errorCode, number)                                       \
+#define KV_INTERNAL_CHECK_SRC(srcRef, errorCode, number)                                           \
   KvCInternalCheck::reportWithSrcRef(__FILE__, __LINE__, (srcRef), (errorCode), (number))
 // Evaluates `cond`; when it fails, reports the internal check. Yields `cond` as a bool:
 //   if (!KV_VERIFY(symbol != nullptr, "KvCInlineSymbolDb", 120)) return false;
-#define KV_VERIFY(cond, errorCode, number)                                                     \
+#define KV_VERIFY(cond, errorCode, number)                                                         \
   ((cond) ? true : (KV_INTERNAL_CHECK(errorCode, number), false))
 // The debug assertion: reports the text of `cond` when it fails (debug builds only).
-#define KV_DEBUG_ASSERT(cond)                                                                  \
-  do {                                                                                         \
-    if (!(cond))                                                                               \
-      KvCInternalCheck::debugAssertFailed(__FILE__, __LINE__, #cond);                          \
+#define KV_DEBUG_ASSERT(cond)                                                                      \
+  do {                                                                                             \
+    if (!(cond))                                                                                   \
+      KvCInternalCheck::debugAssertFailed(__FILE__, __LINE__, #cond);                              \
   } while (0)
 
 #endif

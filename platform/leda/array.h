@@ -35,8 +35,8 @@ public:
   int size() const { return static_cast<int>(slots_.size()); }
   bool empty() const { return slots_.empty(); }
 
-  T &operator[](int i) { return slots_[offset(i)].value; }
-  const T &operator[](int i) const { return slots_[offset(i)].value; }
+  T& operator[](int i) { return slots_[offset(i)].value; }
+  const T& operator[](int i) const { return slots_[offset(i)].value; }
 
   void resize(int n) { resize(0, n - 1); }
 
@@ -51,8 +51,8 @@ public:
   }
 
   // Sets every element to x.
-  void init(const T &x) {
-    for (detail::Slot<T> &slot : slots_)
+  void init(const T& x) {
+    for (detail::Slot<T>& slot : slots_)
       slot.value = x;
   }
 

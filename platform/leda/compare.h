@@ -14,7 +14,7 @@
 
 namespace leda {
 
-template <class T> int compare(const T &a, const T &b) {
+template <class T> int compare(const T& a, const T& b) {
   std::less<T> less;
   if (less(a, b))
     return -1;
@@ -23,15 +23,15 @@ template <class T> int compare(const T &a, const T &b) {
 
 namespace detail {
 
-template <class T> using CompareFn = int (*)(const T &, const T &);
+template <class T> using CompareFn = int (*)(const T&, const T&);
 
-template <class T> int defaultCompare(const T &a, const T &b) { return compare(a, b); }
+template <class T> int defaultCompare(const T& a, const T& b) { return compare(a, b); }
 
 // Strict weak ordering adaptor over a three-way compare function.
 template <class T> struct FnLess {
   CompareFn<T> cmp = &defaultCompare<T>;
 
-  bool operator()(const T &a, const T &b) const { return cmp(a, b) < 0; }
+  bool operator()(const T& a, const T& b) const { return cmp(a, b) < 0; }
 };
 
 } // namespace detail

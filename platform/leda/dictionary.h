@@ -23,7 +23,7 @@ template <class K, class V> class dictionary {
 
 public:
   using value_type = std::pair<const K, V>;
-  using item = value_type *;
+  using item = value_type*;
   using iterator = typename Tree::iterator;
   using const_iterator = typename Tree::const_iterator;
 
@@ -31,46 +31,46 @@ public:
   explicit dictionary(detail::CompareFn<K> cmp) : entries_(detail::FnLess<K>{cmp}) {}
 
   // Defines k with info i, replacing the info if k is already defined.
-  item insert(const K &k, const V &i) {
+  item insert(const K& k, const V& i) {
     auto [pos, inserted] = entries_.try_emplace(k, i);
     if (!inserted)
       pos->second = i;
     return &*pos;
   }
 
-  item lookup(const K &k) const {
+  item lookup(const K& k) const {
     auto pos = entries_.find(k);
     return pos == entries_.end() ? nullptr : const_cast<item>(&*pos);
   }
 
-  const K &key(item it) const {
+  const K& key(item it) const {
     assert(it);
     return it->first;
   }
-  V &inf(item it) {
+  V& inf(item it) {
     assert(it);
     return it->second;
   }
-  const V &inf(item it) const {
+  const V& inf(item it) const {
     assert(it);
     return it->second;
   }
 
-  V &access(const K &k) {
+  V& access(const K& k) {
     auto pos = entries_.find(k);
     assert(pos != entries_.end());
     return pos->second;
   }
-  const V &access(const K &k) const {
+  const V& access(const K& k) const {
     auto pos = entries_.find(k);
     assert(pos != entries_.end());
     return pos->second;
   }
 
-  bool defined(const K &k) const { return entries_.find(k) != entries_.end(); }
+  bool defined(const K& k) const { return entries_.find(k) != entries_.end(); }
 
   // Returns false if k was not defined.
-  bool del(const K &k) { return entries_.erase(k) != 0; }
+  bool del(const K& k) { return entries_.erase(k) != 0; }
 
   void del_item(item it) {
     assert(it);

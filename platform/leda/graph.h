@@ -31,12 +31,12 @@ struct NodeRec {
   virtual ~NodeRec() = default;
 
   int id = 0;
-  NodeRec *prev = nullptr;
-  NodeRec *next = nullptr;
-  EdgeRec *outFirst = nullptr;
-  EdgeRec *outLast = nullptr;
-  EdgeRec *inFirst = nullptr;
-  EdgeRec *inLast = nullptr;
+  NodeRec* prev = nullptr;
+  NodeRec* next = nullptr;
+  EdgeRec* outFirst = nullptr;
+  EdgeRec* outLast = nullptr;
+  EdgeRec* inFirst = nullptr;
+  EdgeRec* inLast = nullptr;
   // Degrees count visible edges only.
   int outdeg = 0;
   int indeg = 0;
@@ -48,14 +48,14 @@ struct EdgeRec {
   bool hidden() const { return hiddenPos >= 0; }
 
   int id = 0;
-  NodeRec *src = nullptr;
-  NodeRec *tgt = nullptr;
-  EdgeRec *prev = nullptr;
-  EdgeRec *next = nullptr;
-  EdgeRec *outPrev = nullptr;
-  EdgeRec *outNext = nullptr;
-  EdgeRec *inPrev = nullptr;
-  EdgeRec *inNext = nullptr;
+  NodeRec* src = nullptr;
+  NodeRec* tgt = nullptr;
+  EdgeRec* prev = nullptr;
+  EdgeRec* next = nullptr;
+  EdgeRec* outPrev = nullptr;
+  EdgeRec* outNext = nullptr;
+  EdgeRec* inPrev = nullptr;
+  EdgeRec* inNext = nullptr;
   // Position in the owning graph's list of hidden edges, -1 if visible.
   int hiddenPos = -1;
 };
@@ -76,56 +76,56 @@ template <class E> struct EdgeRecOf : EdgeRec {
 class NodeIterator {
 public:
   using iterator_category = std::forward_iterator_tag;
-  using value_type = NodeRec *;
+  using value_type = NodeRec*;
   using difference_type = std::ptrdiff_t;
-  using pointer = NodeRec *const *;
-  using reference = NodeRec *;
+  using pointer = NodeRec* const*;
+  using reference = NodeRec*;
 
   NodeIterator() = default;
-  explicit NodeIterator(NodeRec *cur) : cur_(cur), next_(cur ? cur->next : nullptr) {}
+  explicit NodeIterator(NodeRec* cur) : cur_(cur), next_(cur ? cur->next : nullptr) {}
 
-  NodeRec *operator*() const { return cur_; }
-  NodeIterator &operator++() {
+  NodeRec* operator*() const { return cur_; }
+  NodeIterator& operator++() {
     cur_ = next_;
     next_ = cur_ ? cur_->next : nullptr;
     return *this;
   }
-  bool operator==(const NodeIterator &other) const { return cur_ == other.cur_; }
+  bool operator==(const NodeIterator& other) const { return cur_ == other.cur_; }
 
 private:
-  NodeRec *cur_ = nullptr;
-  NodeRec *next_ = nullptr;
+  NodeRec* cur_ = nullptr;
+  NodeRec* next_ = nullptr;
 };
 
 // Walks one of the edge lists selected by Next, skipping hidden edges.
-template <EdgeRec *EdgeRec::*Next> class EdgeIterator {
+template <EdgeRec* EdgeRec::*Next> class EdgeIterator {
 public:
   using iterator_category = std::forward_iterator_tag;
-  using value_type = EdgeRec *;
+  using value_type = EdgeRec*;
   using difference_type = std::ptrdiff_t;
-  using pointer = EdgeRec *const *;
-  using reference = EdgeRec *;
+  using pointer = EdgeRec* const*;
+  using reference = EdgeRec*;
 
   EdgeIterator() = default;
-  explicit EdgeIterator(EdgeRec *cur) { settle(cur); }
+  explicit EdgeIterator(EdgeRec* cur) { settle(cur); }
 
-  EdgeRec *operator*() const { return cur_; }
-  EdgeIterator &operator++() {
+  EdgeRec* operator*() const { return cur_; }
+  EdgeIterator& operator++() {
     settle(next_);
     return *this;
   }
-  bool operator==(const EdgeIterator &other) const { return cur_ == other.cur_; }
+  bool operator==(const EdgeIterator& other) const { return cur_ == other.cur_; }
 
 private:
-  void settle(EdgeRec *e) {
+  void settle(EdgeRec* e) {
     while (e && e->hidden())
       e = e->*Next;
     cur_ = e;
     next_ = e ? e->*Next : nullptr;
   }
 
-  EdgeRec *cur_ = nullptr;
-  EdgeRec *next_ = nullptr;
+  EdgeRec* cur_ = nullptr;
+  EdgeRec* next_ = nullptr;
 };
 
 template <class It> class Range {
@@ -139,7 +139,7 @@ private:
 };
 
 // Visible edge following e (inclusive) in the list selected by Next.
-template <EdgeRec *EdgeRec::*Next> EdgeRec *firstVisible(EdgeRec *e) {
+template <EdgeRec* EdgeRec::*Next> EdgeRec* firstVisible(EdgeRec* e) {
   while (e && e->hidden())
     e = e->*Next;
   return e;
@@ -147,8 +147,8 @@ template <EdgeRec *EdgeRec::*Next> EdgeRec *firstVisible(EdgeRec *e) {
 
 } // namespace detail
 
-using node = detail::NodeRec *;
-using edge = detail::EdgeRec *;
+using node = detail::NodeRec*;
+using edge = detail::EdgeRec*;
 inline constexpr std::nullptr_t nil = nullptr;
 
 // A directed graph (multi-edges and self-loops allowed). The graph owns its
@@ -166,8 +166,8 @@ public:
   using InEdgeRange = detail::Range<InEdgeIterator>;
 
   graph() = default;
-  graph(const graph &) = delete;
-  graph &operator=(const graph &) = delete;
+  graph(const graph&) = delete;
+  graph& operator=(const graph&) = delete;
   virtual ~graph() { clear(); }
 
   node new_node() { return linkNode(makeNode()); }
@@ -293,10 +293,10 @@ public:
 protected:
   // Record factories for new_node() / new_edge(); GRAPH makes records that
   // carry a default payload.
-  virtual detail::NodeRec *makeNode() { return new detail::NodeRec; }
-  virtual detail::EdgeRec *makeEdge() { return new detail::EdgeRec; }
+  virtual detail::NodeRec* makeNode() { return new detail::NodeRec; }
+  virtual detail::EdgeRec* makeEdge() { return new detail::EdgeRec; }
 
-  node linkNode(detail::NodeRec *v) {
+  node linkNode(detail::NodeRec* v) {
     v->id = nextNodeId_++;
     v->prev = lastNode_;
     (lastNode_ ? lastNode_->next : firstNode_) = v;
@@ -305,7 +305,7 @@ protected:
     return v;
   }
 
-  edge linkEdge(detail::EdgeRec *e, node v, node w) {
+  edge linkEdge(detail::EdgeRec* e, node v, node w) {
     assert(v && w);
     e->id = nextEdgeId_++;
     e->src = v;
@@ -358,25 +358,25 @@ public:
   using graph::new_edge;
   using graph::new_node;
 
-  node new_node(const V &x) { return linkNode(new detail::NodeRecOf<V>(x)); }
-  edge new_edge(node v, node w, const E &x) { return linkEdge(new detail::EdgeRecOf<E>(x), v, w); }
+  node new_node(const V& x) { return linkNode(new detail::NodeRecOf<V>(x)); }
+  edge new_edge(node v, node w, const E& x) { return linkEdge(new detail::EdgeRecOf<E>(x), v, w); }
 
-  const V &inf(node v) const { return payload(v); }
-  const E &inf(edge e) const { return payload(e); }
-  V &operator[](node v) { return payload(v); }
-  const V &operator[](node v) const { return payload(v); }
-  E &operator[](edge e) { return payload(e); }
-  const E &operator[](edge e) const { return payload(e); }
-  void assign(node v, const V &x) { payload(v) = x; }
-  void assign(edge e, const E &x) { payload(e) = x; }
+  const V& inf(node v) const { return payload(v); }
+  const E& inf(edge e) const { return payload(e); }
+  V& operator[](node v) { return payload(v); }
+  const V& operator[](node v) const { return payload(v); }
+  E& operator[](edge e) { return payload(e); }
+  const E& operator[](edge e) const { return payload(e); }
+  void assign(node v, const V& x) { payload(v) = x; }
+  void assign(edge e, const E& x) { payload(e) = x; }
 
 protected:
-  detail::NodeRec *makeNode() override { return new detail::NodeRecOf<V>(V()); }
-  detail::EdgeRec *makeEdge() override { return new detail::EdgeRecOf<E>(E()); }
+  detail::NodeRec* makeNode() override { return new detail::NodeRecOf<V>(V()); }
+  detail::EdgeRec* makeEdge() override { return new detail::EdgeRecOf<E>(E()); }
 
 private:
-  static V &payload(node v) { return static_cast<detail::NodeRecOf<V> *>(v)->inf; }
-  static E &payload(edge e) { return static_cast<detail::EdgeRecOf<E> *>(e)->inf; }
+  static V& payload(node v) { return static_cast<detail::NodeRecOf<V>*>(v)->inf; }
+  static E& payload(edge e) { return static_cast<detail::EdgeRecOf<E>*>(e)->inf; }
 };
 
 namespace detail {
@@ -387,7 +387,7 @@ namespace detail {
 // value. References stay valid until the array grows.
 template <class T, class Rec> class HandleArray {
 public:
-  T &operator[](Rec *h) {
+  T& operator[](Rec* h) {
     assert(h);
     std::size_t i = static_cast<std::size_t>(h->id);
     if (i >= slots_.size())
@@ -395,7 +395,7 @@ public:
     return slots_[i].value;
   }
 
-  const T &operator[](Rec *h) const {
+  const T& operator[](Rec* h) const {
     assert(h);
     std::size_t i = static_cast<std::size_t>(h->id);
     return i < slots_.size() ? slots_[i].value : init_;
@@ -417,17 +417,17 @@ private:
 template <class T> class node_array : public detail::HandleArray<T, detail::NodeRec> {
 public:
   node_array() = default;
-  explicit node_array(const graph &G, T x = T()) { init(G, std::move(x)); }
+  explicit node_array(const graph& G, T x = T()) { init(G, std::move(x)); }
 
-  void init(const graph &G, T x = T()) { this->reset(G.max_node_index(), std::move(x)); }
+  void init(const graph& G, T x = T()) { this->reset(G.max_node_index(), std::move(x)); }
 };
 
 template <class T> class edge_array : public detail::HandleArray<T, detail::EdgeRec> {
 public:
   edge_array() = default;
-  explicit edge_array(const graph &G, T x = T()) { init(G, std::move(x)); }
+  explicit edge_array(const graph& G, T x = T()) { init(G, std::move(x)); }
 
-  void init(const graph &G, T x = T()) { this->reset(G.max_edge_index(), std::move(x)); }
+  void init(const graph& G, T x = T()) { this->reset(G.max_edge_index(), std::move(x)); }
 };
 
 } // namespace leda

@@ -25,10 +25,10 @@ public:
   list() = default;
   list(std::initializer_list<T> init) : items_(init) {}
 
-  void append(const T &x) { items_.push_back(x); }
-  void append(T &&x) { items_.push_back(std::move(x)); }
-  void push(const T &x) { items_.push_front(x); }
-  void push(T &&x) { items_.push_front(std::move(x)); }
+  void append(const T& x) { items_.push_back(x); }
+  void append(T&& x) { items_.push_back(std::move(x)); }
+  void push(const T& x) { items_.push_front(x); }
+  void push(T&& x) { items_.push_front(std::move(x)); }
 
   T pop() {
     assert(!items_.empty());
@@ -44,26 +44,26 @@ public:
     return x;
   }
 
-  T &front() {
+  T& front() {
     assert(!items_.empty());
     return items_.front();
   }
-  const T &front() const {
+  const T& front() const {
     assert(!items_.empty());
     return items_.front();
   }
-  T &back() {
+  T& back() {
     assert(!items_.empty());
     return items_.back();
   }
-  const T &back() const {
+  const T& back() const {
     assert(!items_.empty());
     return items_.back();
   }
-  T &head() { return front(); }
-  const T &head() const { return front(); }
-  T &tail() { return back(); }
-  const T &tail() const { return back(); }
+  T& head() { return front(); }
+  const T& head() const { return front(); }
+  T& tail() { return back(); }
+  const T& tail() const { return back(); }
 
   int size() const { return static_cast<int>(items_.size()); }
   int length() const { return size(); }
@@ -71,18 +71,18 @@ public:
   void clear() { items_.clear(); }
 
   // Removes every element equal to x; returns how many were removed.
-  int remove(const T &x) { return static_cast<int>(items_.remove(x)); }
+  int remove(const T& x) { return static_cast<int>(items_.remove(x)); }
 
   // The first element equal to x, or nullptr. O(n).
-  T *search(const T &x) {
+  T* search(const T& x) {
     auto it = std::find(items_.begin(), items_.end(), x);
     return it == items_.end() ? nullptr : &*it;
   }
-  const T *search(const T &x) const {
+  const T* search(const T& x) const {
     auto it = std::find(items_.begin(), items_.end(), x);
     return it == items_.end() ? nullptr : &*it;
   }
-  bool contains(const T &x) const { return search(x) != nullptr; }
+  bool contains(const T& x) const { return search(x) != nullptr; }
 
   void sort() { items_.sort(); }
 
@@ -91,7 +91,7 @@ public:
   const_iterator begin() const { return items_.begin(); }
   const_iterator end() const { return items_.end(); }
 
-  friend bool operator==(const list &a, const list &b) { return a.items_ == b.items_; }
+  friend bool operator==(const list& a, const list& b) { return a.items_ == b.items_; }
 
 private:
   std::list<T> items_;

@@ -28,8 +28,8 @@ public:
   map() = default;
   explicit map(V def) : def_(std::move(def)) {}
 
-  map(const map &other) : def_(other.def_) { copyEntries(other); }
-  map &operator=(const map &other) {
+  map(const map& other) : def_(other.def_) { copyEntries(other); }
+  map& operator=(const map& other) {
     if (this == &other)
       return *this;
     clear();
@@ -37,10 +37,10 @@ public:
     copyEntries(other);
     return *this;
   }
-  map(map &&) = default;
-  map &operator=(map &&) = default;
+  map(map&&) = default;
+  map& operator=(map&&) = default;
 
-  V &operator[](const K &k) {
+  V& operator[](const K& k) {
     auto found = index_.find(k);
     if (found != index_.end())
       return found->second->second;
@@ -49,15 +49,15 @@ public:
     return entries_.back().second;
   }
 
-  const V &operator[](const K &k) const {
+  const V& operator[](const K& k) const {
     auto found = index_.find(k);
     return found == index_.end() ? def_ : found->second->second;
   }
 
-  bool defined(const K &k) const { return index_.find(k) != index_.end(); }
+  bool defined(const K& k) const { return index_.find(k) != index_.end(); }
 
   // Returns false if k was not defined.
-  bool undefine(const K &k) {
+  bool undefine(const K& k) {
     auto found = index_.find(k);
     if (found == index_.end())
       return false;
@@ -79,9 +79,9 @@ public:
   const_iterator end() const { return entries_.end(); }
 
 private:
-  void copyEntries(const map &other) {
+  void copyEntries(const map& other) {
     index_.reserve(other.index_.size());
-    for (const value_type &entry : other.entries_) {
+    for (const value_type& entry : other.entries_) {
       entries_.push_back(entry);
       index_.emplace(entry.first, std::prev(entries_.end()));
     }

@@ -29,48 +29,48 @@ public:
   explicit set(detail::CompareFn<T> cmp) : items_(detail::FnLess<T>{cmp}) {}
 
   // Returns false if an equal element was already present (it is kept).
-  bool insert(const T &x) { return items_.insert(x).second; }
+  bool insert(const T& x) { return items_.insert(x).second; }
   // Returns false if no equal element was present.
-  bool del(const T &x) { return items_.erase(x) != 0; }
-  bool erase(const T &x) { return del(x); }
+  bool del(const T& x) { return items_.erase(x) != 0; }
+  bool erase(const T& x) { return del(x); }
 
-  bool member(const T &x) const { return items_.find(x) != items_.end(); }
-  bool contains(const T &x) const { return member(x); }
+  bool member(const T& x) const { return items_.find(x) != items_.end(); }
+  bool contains(const T& x) const { return member(x); }
 
   int size() const { return static_cast<int>(items_.size()); }
   bool empty() const { return items_.empty(); }
   void clear() { items_.clear(); }
 
-  const T &min() const {
+  const T& min() const {
     assert(!items_.empty());
     return *items_.begin();
   }
-  const T &max() const {
+  const T& max() const {
     assert(!items_.empty());
     return *items_.rbegin();
   }
 
-  set join(const set &other) const {
+  set join(const set& other) const {
     set result(*this);
-    for (const T &x : other.items_)
+    for (const T& x : other.items_)
       result.insert(x);
     return result;
   }
 
-  set intersect(const set &other) const { return filter(other, true); }
-  set diff(const set &other) const { return filter(other, false); }
+  set intersect(const set& other) const { return filter(other, true); }
+  set diff(const set& other) const { return filter(other, false); }
 
-  friend set operator+(const set &a, const set &b) { return a.join(b); }
-  friend set operator&(const set &a, const set &b) { return a.intersect(b); }
-  friend set operator-(const set &a, const set &b) { return a.diff(b); }
+  friend set operator+(const set& a, const set& b) { return a.join(b); }
+  friend set operator&(const set& a, const set& b) { return a.intersect(b); }
+  friend set operator-(const set& a, const set& b) { return a.diff(b); }
 
   const_iterator begin() const { return items_.begin(); }
   const_iterator end() const { return items_.end(); }
 
 private:
-  set filter(const set &other, bool keepMembers) const {
+  set filter(const set& other, bool keepMembers) const {
     set result(items_.key_comp().cmp);
-    for (const T &x : items_) {
+    for (const T& x : items_) {
       if (other.member(x) == keepMembers)
         result.items_.insert(result.items_.end(), x);
     }

@@ -13,8 +13,8 @@ namespace leda {
 // that element is popped.
 template <class T> class stack {
 public:
-  void push(const T &x) { items_.push_back(x); }
-  void push(T &&x) { items_.push_back(std::move(x)); }
+  void push(const T& x) { items_.push_back(x); }
+  void push(T&& x) { items_.push_back(std::move(x)); }
 
   T pop() {
     assert(!items_.empty());
@@ -23,11 +23,11 @@ public:
     return x;
   }
 
-  T &top() {
+  T& top() {
     assert(!items_.empty());
     return items_.back();
   }
-  const T &top() const {
+  const T& top() const {
     assert(!items_.empty());
     return items_.back();
   }

@@ -25,11 +25,11 @@ namespace detail {
 // while the search runs.
 class SccSearch {
 public:
-  explicit SccSearch(const graph &G)
+  explicit SccSearch(const graph& G)
       : G_(G), bound_(static_cast<std::size_t>(G.max_node_index() + 1)), order_(bound_, -1),
         low_(bound_, 0), onStack_(bound_, 0), cursor_(bound_, nullptr), comp_(bound_, -1) {}
 
-  int run(node_array<int> &compnum) {
+  int run(node_array<int>& compnum) {
     for (node v : G_.all_nodes()) {
       if (order_[slot(v)] < 0)
         searchFrom(v);
@@ -69,7 +69,7 @@ private:
       if (low_[slot(v)] == order_[slot(v)])
         closeComponent(v);
       if (!callStack_.empty()) {
-        int &parentLow = low_[slot(callStack_.back())];
+        int& parentLow = low_[slot(callStack_.back())];
         parentLow = std::min(parentLow, low_[slot(v)]);
       }
     }
@@ -96,11 +96,11 @@ private:
     ++components_;
   }
 
-  int renumber(node_array<int> &compnum) const {
+  int renumber(node_array<int>& compnum) const {
     std::vector<int> finalNumber(static_cast<std::size_t>(components_), -1);
     int next = 0;
     for (node v : G_.all_nodes()) {
-      int &number = finalNumber[static_cast<std::size_t>(comp_[slot(v)])];
+      int& number = finalNumber[static_cast<std::size_t>(comp_[slot(v)])];
       if (number < 0)
         number = next++;
       compnum[v] = number;
@@ -108,7 +108,7 @@ private:
     return components_;
   }
 
-  const graph &G_;
+  const graph& G_;
   std::size_t bound_;
   std::vector<int> order_; // discovery number, -1 if not yet discovered
   std::vector<int> low_;
@@ -123,7 +123,7 @@ private:
 
 } // namespace detail
 
-inline int STRONG_COMPONENTS(const graph &G, node_array<int> &compnum) {
+inline int STRONG_COMPONENTS(const graph& G, node_array<int>& compnum) {
   return detail::SccSearch(G).run(compnum);
 }
 

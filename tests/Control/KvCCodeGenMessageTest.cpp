@@ -29,8 +29,8 @@ TEST_F(MessageTest, EveryMessageHasItsNumberSeverityCategorySourceAndText) {
   const std::vector<Expected> table = {
       {"10007", [](const KvCSrcRef*) { KvCCodeGenMessage::msg10007("KvCInlineSymbolDb", 77); },
        10007, 3, "General Messages", false, internalError("KvCInlineSymbolDb", 77)},
-      {"10008", [](const KvCSrcRef* r) { KvCCodeGenMessage::msg10008(r, "a/b.cpp", 233); },
-       10008, 3, "General Messages", true, internalError("a/b.cpp", 233)},
+      {"10008", [](const KvCSrcRef* r) { KvCCodeGenMessage::msg10008(r, "a/b.cpp", 233); }, 10008,
+       3, "General Messages", true, internalError("a/b.cpp", 233)},
       {"21272", [](const KvCSrcRef* r) { KvCCodeGenMessage::msg21272(r, "OSEK1"); }, 21272, 2,
        "Counter Alarm Block Messages", true,
        "CounterAlarm: No function kind to get the CounterValue is specified for the currently "
@@ -46,9 +46,11 @@ TEST_F(MessageTest, EveryMessageHasItsNumberSeverityCategorySourceAndText) {
        "CounterAlarm: No function kind to initialize the counter is specified for the "
        "currently selected RTOS OSEK3. Use the 'Omit counter initialization' option."},
       {"30179", [](const KvCSrcRef* r) { KvCCodeGenMessage::msg30179(r, "MyFcn"); }, 30179, 2,
-       "RTOS Messages", true, "The number of arguments for the user-defined function MyFcn differ."},
+       "RTOS Messages", true,
+       "The number of arguments for the user-defined function MyFcn differ."},
       {"30243", [](const KvCSrcRef* r) { KvCCodeGenMessage::msg30243(r, "MyMacro"); }, 30243, 2,
-       "RTOS Messages", true, "Function template for user-defined function or macro MyMacro missing"},
+       "RTOS Messages", true,
+       "Function template for user-defined function or macro MyMacro missing"},
       {"31688", [](const KvCSrcRef* r) { KvCCodeGenMessage::msg31688(r, "TickType", "width"); },
        31688, 1, "RTOS Messages", true,
        "The RTOS data type TickType is specified in the RTOSInfo file and also in the Data "

@@ -33,8 +33,8 @@ TEST(OptionTable, CountsPerKindAndEncodedNamesAreDistinctAndReversible) {
   std::map<std::string, int> kinds;
   std::set<std::string> encoded;
   std::vector<std::string> names;
-#define HULCV_OPTION(Kind, Name)                                                               \
-  ++kinds[#Kind];                                                                              \
+#define HULCV_OPTION(Kind, Name)                                                                   \
+  ++kinds[#Kind];                                                                                  \
   names.push_back(#Name);
 #include "HulCvTools/Control/KvCCvToolsOptions.def"
   EXPECT_EQ(kinds["Bool"], 146);
@@ -96,15 +96,15 @@ TEST_F(OptionsInterfaceTest, EverySetterWritesOnlyItsOwnOptionUnderTheAssignedId
   int i = 0;
   // Write option i, read it back from the storage, then reset it: a setter that used
   // another name, another id or another type would leave the value unseen.
-#define HULCV_OPTION(Kind, Name)                                                               \
-  {                                                                                            \
-    SCOPED_TRACE(#Name);                                                                       \
-    const std::string enc = KvCOptionNameCodec::encode(#Name);                                 \
-    EXPECT_TRUE(options.set##Name(HULCV_VALUE_##Kind(i)));                                     \
-    EXPECT_EQ(storage.HULCV_READ_##Kind(id, enc.c_str()), HULCV_VALUE_##Kind(i));              \
-    EXPECT_EQ(storage.HULCV_READ_##Kind(1, enc.c_str()), HULCV_ZERO_##Kind);                   \
-    EXPECT_TRUE(options.set##Name(HULCV_ZERO_##Kind));                                         \
-    ++i;                                                                                       \
+#define HULCV_OPTION(Kind, Name)                                                                   \
+  {                                                                                                \
+    SCOPED_TRACE(#Name);                                                                           \
+    const std::string enc = KvCOptionNameCodec::encode(#Name);                                     \
+    EXPECT_TRUE(options.set##Name(HULCV_VALUE_##Kind(i)));                                         \
+    EXPECT_EQ(storage.HULCV_READ_##Kind(id, enc.c_str()), HULCV_VALUE_##Kind(i));                  \
+    EXPECT_EQ(storage.HULCV_READ_##Kind(1, enc.c_str()), HULCV_ZERO_##Kind);                       \
+    EXPECT_TRUE(options.set##Name(HULCV_ZERO_##Kind));                                             \
+    ++i;                                                                                           \
   }
 #include "HulCvTools/Control/KvCCvToolsOptions.def"
   EXPECT_EQ(i, 229);
@@ -115,15 +115,15 @@ TEST_F(OptionsInterfaceTest, EveryGetterReadsOnlyItsOwnOptionUnderTheAssignedId)
   ASSERT_TRUE(options.boot(&storage));
   const int id = options.getInterfaceId();
   int i = 0;
-#define HULCV_OPTION(Kind, Name)                                                               \
-  {                                                                                            \
-    SCOPED_TRACE(#Name);                                                                       \
-    const std::string enc = KvCOptionNameCodec::encode(#Name);                                 \
-    EXPECT_EQ(options.get##Name(), HULCV_ZERO_##Kind);                                         \
-    ASSERT_TRUE(storage.setOptionValueByEncodedName(id, enc.c_str(), HULCV_VALUE_##Kind(i)));  \
-    EXPECT_EQ(options.get##Name(), HULCV_VALUE_##Kind(i));                                     \
-    ASSERT_TRUE(storage.setOptionValueByEncodedName(id, enc.c_str(), HULCV_ZERO_##Kind));      \
-    ++i;                                                                                       \
+#define HULCV_OPTION(Kind, Name)                                                                   \
+  {                                                                                                \
+    SCOPED_TRACE(#Name);                                                                           \
+    const std::string enc = KvCOptionNameCodec::encode(#Name);                                     \
+    EXPECT_EQ(options.get##Name(), HULCV_ZERO_##Kind);                                             \
+    ASSERT_TRUE(storage.setOptionValueByEncodedName(id, enc.c_str(), HULCV_VALUE_##Kind(i)));      \
+    EXPECT_EQ(options.get##Name(), HULCV_VALUE_##Kind(i));                                         \
+    ASSERT_TRUE(storage.setOptionValueByEncodedName(id, enc.c_str(), HULCV_ZERO_##Kind));          \
+    ++i;                                                                                           \
   }
 #include "HulCvTools/Control/KvCCvToolsOptions.def"
   EXPECT_EQ(i, 229);

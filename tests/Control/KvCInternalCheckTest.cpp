@@ -33,8 +33,8 @@ TEST_F(InternalCheckTest, ShownInternalInfoRaisesDebugReportBeforeTheMessage) {
       [](void* raw, const char* file, int line, const char* expression) {
         auto* c = static_cast<Context*>(raw);
         c->order->push_back(std::string("report ") + file + ":" + std::to_string(line) + " " +
-                           expression + " after " +
-                           std::to_string(c->server->getMessages().size()) + " messages");
+                            expression + " after " +
+                            std::to_string(c->server->getMessages().size()) + " messages");
       },
       &context);
   const int line = __LINE__ + 1;
@@ -56,8 +56,7 @@ TEST_F(InternalCheckTest, CheckWithSourceReferenceEmits10008) {
   EXPECT_EQ(messages()[0].number, 10008);
   EXPECT_EQ(messages()[0].srcRef, &where);
   EXPECT_EQ(messages()[0].srcRefText.str(), "model/Block");
-  EXPECT_NE(messages()[0].text.str().find("KvCGenericFunctionCallGraph 233."),
-            std::string::npos);
+  EXPECT_NE(messages()[0].text.str().find("KvCGenericFunctionCallGraph 233."), std::string::npos);
 }
 
 TEST_F(InternalCheckTest, DebugAssertionReportsTheConditionTextAndEmitsNoMessage) {
@@ -103,8 +102,8 @@ TEST_F(InternalCheckTest, ReplacedHandlerCanBeRestored) {
   KvCMessageServer::DebugAssertionHandler previous = nullptr;
   void* previousContext = nullptr;
   server().setDebugAssertionHandler(
-      [](void* c, const char*, int, const char*) { ++*static_cast<int*>(c); }, &calls,
-      &previous, &previousContext);
+      [](void* c, const char*, int, const char*) { ++*static_cast<int*>(c); }, &calls, &previous,
+      &previousContext);
   KV_DEBUG_ASSERT(false);
   server().setDebugAssertionHandler(previous, previousContext);
   KV_DEBUG_ASSERT(false);

@@ -18,14 +18,14 @@ struct LedaTestSymbol {
   int tag = 0;
 };
 
-int compare(LedaTestSymbol *const &a, LedaTestSymbol *const &b);
-int compare(LedaTestSymbol *const &a, LedaTestSymbol *const &b) { return a->name.compare(b->name); }
+int compare(LedaTestSymbol* const& a, LedaTestSymbol* const& b);
+int compare(LedaTestSymbol* const& a, LedaTestSymbol* const& b) { return a->name.compare(b->name); }
 
 namespace {
 
-template <class Container> auto contents(const Container &c) {
+template <class Container> auto contents(const Container& c) {
   std::vector<std::decay_t<decltype(*c.begin())>> result;
-  for (const auto &x : c)
+  for (const auto& x : c)
     result.push_back(x);
   return result;
 }
@@ -35,12 +35,12 @@ struct Keyed {
   char label;
 };
 
-int byKey(const Keyed &a, const Keyed &b) { return a.key - b.key; }
-int descending(const int &a, const int &b) { return b - a; }
+int byKey(const Keyed& a, const Keyed& b) { return a.key - b.key; }
+int descending(const int& a, const int& b) { return b - a; }
 
-std::vector<std::pair<int, char>> keysAndLabels(const leda::set<Keyed> &s) {
+std::vector<std::pair<int, char>> keysAndLabels(const leda::set<Keyed>& s) {
   std::vector<std::pair<int, char>> result;
-  for (const Keyed &k : s)
+  for (const Keyed& k : s)
     result.emplace_back(k.key, k.label);
   return result;
 }
@@ -86,20 +86,20 @@ TEST(LedaSet, SetAlgebraAndCopiesKeepTheOrderFunction) {
 
 TEST(LedaSet, DefaultOrderUsesUserCompareOverloadBeforeAddressOrder) {
   std::vector<LedaTestSymbol> symbols{{"c", 0}, {"a", 1}, {"b", 2}, {"a", 3}};
-  leda::set<LedaTestSymbol *> byName;
-  for (LedaTestSymbol &sym : symbols)
+  leda::set<LedaTestSymbol*> byName;
+  for (LedaTestSymbol& sym : symbols)
     byName.insert(&sym);
   std::vector<int> tags;
-  for (LedaTestSymbol *sym : byName)
+  for (LedaTestSymbol* sym : byName)
     tags.push_back(sym->tag);
   EXPECT_EQ(tags, (std::vector<int>{1, 2, 0}));
 
-  leda::set<int *> byAddress;
+  leda::set<int*> byAddress;
   std::vector<int> values(3);
   byAddress.insert(&values[2]);
   byAddress.insert(&values[0]);
   byAddress.insert(&values[1]);
-  EXPECT_EQ(contents(byAddress), (std::vector<int *>{&values[0], &values[1], &values[2]}));
+  EXPECT_EQ(contents(byAddress), (std::vector<int*>{&values[0], &values[1], &values[2]}));
 }
 
 TEST(LedaMap, IteratesInInsertionOrderAndRedefinedKeysMoveToTheEnd) {
@@ -114,7 +114,7 @@ TEST(LedaMap, IteratesInInsertionOrderAndRedefinedKeysMoveToTheEnd) {
   m["x"] = 4;
   using Entries = std::vector<std::pair<std::string, int>>;
   Entries seen;
-  for (const auto &[k, v] : m)
+  for (const auto& [k, v] : m)
     seen.emplace_back(k, v);
   EXPECT_EQ(seen, (Entries{{"y", 12}, {"z", 3}, {"x", 4}}));
 
@@ -123,14 +123,14 @@ TEST(LedaMap, IteratesInInsertionOrderAndRedefinedKeysMoveToTheEnd) {
   copy["w"];
   EXPECT_EQ(m.size(), 3);
   seen.clear();
-  for (const auto &[k, v] : copy)
+  for (const auto& [k, v] : copy)
     seen.emplace_back(k, v);
   EXPECT_EQ(seen, (Entries{{"y", 12}, {"x", 4}, {"w", 0}}));
 }
 
 TEST(LedaMap, DefaultValueAndConstReadsDoNotDefine) {
   leda::map<int, int> m(-1);
-  const auto &cm = m;
+  const auto& cm = m;
   EXPECT_EQ(cm[5], -1);
   EXPECT_FALSE(m.defined(5));
   EXPECT_EQ(m[5], -1);
@@ -153,7 +153,7 @@ TEST(LedaDictionary, InsertReplacesInfoAndItemsStayValid) {
   EXPECT_EQ(d.size(), 3);
 
   std::vector<std::string> keys;
-  for (const auto &[k, i] : d)
+  for (const auto& [k, i] : d)
     keys.push_back(k);
   EXPECT_EQ(keys, (std::vector<std::string>{"a", "b", "c"}));
 
@@ -172,7 +172,7 @@ TEST(LedaDictionary, CustomCompare) {
   d.insert(3, 'c');
   d.insert(2, 'b');
   std::string infos;
-  for (const auto &[k, i] : d)
+  for (const auto& [k, i] : d)
     infos += i;
   EXPECT_EQ(infos, "cba");
 }
@@ -207,7 +207,7 @@ TEST(LedaArray, IndexRangesResizeAndCopy) {
   leda::array<int> none(0);
   EXPECT_TRUE(none.empty());
   EXPECT_EQ(none.high(), -1);
-  leda::array<const char *> pointers(1, 2);
+  leda::array<const char*> pointers(1, 2);
   EXPECT_EQ(pointers[2], nullptr);
 }
 

@@ -14,7 +14,7 @@ namespace {
 using leda::edge;
 using leda::node;
 
-template <class Range> std::vector<int> indices(const leda::graph &G, const Range &range) {
+template <class Range> std::vector<int> indices(const leda::graph& G, const Range& range) {
   std::vector<int> result;
   for (auto x : range)
     result.push_back(G.index(x));
@@ -23,7 +23,7 @@ template <class Range> std::vector<int> indices(const leda::graph &G, const Rang
 
 // Reachability over visible edges, by breadth-first search from every node.
 // reach[i][j] for the i-th and j-th node in creation order.
-std::vector<std::vector<bool>> reachability(const leda::graph &G, const std::vector<node> &nodes) {
+std::vector<std::vector<bool>> reachability(const leda::graph& G, const std::vector<node>& nodes) {
   leda::node_array<int> pos(G, -1);
   for (std::size_t i = 0; i < nodes.size(); ++i)
     pos[nodes[i]] = static_cast<int>(i);
@@ -46,7 +46,7 @@ std::vector<std::vector<bool>> reachability(const leda::graph &G, const std::vec
 
 // Checks STRONG_COMPONENTS against mutual reachability; returns a failure
 // description or an empty string.
-std::string checkComponents(const leda::graph &G) {
+std::string checkComponents(const leda::graph& G) {
   std::vector<node> nodes;
   for (node v : G.all_nodes())
     nodes.push_back(v);
@@ -292,7 +292,7 @@ TEST_F(LedaGraphFixture, HandleArraysCoverElementsCreatedLater) {
   seen[a] = true;
   node late = G.new_node();
   edge lateEdge = G.new_edge(late, a);
-  const leda::node_array<bool> &constSeen = seen;
+  const leda::node_array<bool>& constSeen = seen;
   EXPECT_FALSE(constSeen[late]);
   seen[late] = true;
   EXPECT_TRUE(seen[late]);
@@ -310,7 +310,7 @@ TEST(LedaGRAPH, PayloadsIncludingDefaultsMadeThroughTheBaseClass) {
   node v = G.new_node("v");
   node w = G.new_node("w");
   edge vw = G.new_edge(v, w, 5);
-  leda::graph &base = G;
+  leda::graph& base = G;
   node u = base.new_node();
   edge wu = base.new_edge(w, u);
   EXPECT_EQ(G.inf(v), "v");
