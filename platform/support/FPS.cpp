@@ -9,9 +9,7 @@ double FPS_RoundUp(double value) { return std::ceil(value); }
 
 double FPS_RoundDown(double value) { return std::floor(value); }
 
-bool FPS_IsIntegerValue(double value) {
-  return std::isfinite(value) && std::trunc(value) == value;
-}
+bool FPS_IsIntegerValue(double value) { return std::isfinite(value) && std::trunc(value) == value; }
 
 bool FPS_ValuesAreEqual(double a, double b) {
   if (a == b)

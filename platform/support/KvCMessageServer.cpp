@@ -10,8 +10,7 @@ KvCMessageServer* KvCMessageServer::getMessageServer() {
 }
 
 bool KvCMessageServer::putMessage(tagERR_error_severity_etp severity, int number,
-                                  const KvCSrcRef* srcRef, const char* category,
-                                  const char* text) {
+                                  const KvCSrcRef* srcRef, const char* category, const char* text) {
   messages.push_back(KvCMessageRecord{severity, number, srcRef,
                                       srcRef ? srcRef->getText() : WmCXString(),
                                       WmCXString(category), WmCXString(text)});

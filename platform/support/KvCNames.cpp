@@ -2,8 +2,7 @@
 
 namespace {
 bool isIdentifierChar(char c) {
-  return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c >= '0' && c <= '9') ||
-         c == '_';
+  return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c >= '0' && c <= '9') || c == '_';
 }
 bool isDigit(char c) { return c >= '0' && c <= '9'; }
 } // namespace

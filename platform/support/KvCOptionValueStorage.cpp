@@ -68,8 +68,8 @@ bool KvCOptionValueStorage::getBoolOptionValueByEncodedName(int id, const char* 
 int KvCOptionValueStorage::getIntOptionValueByEncodedName(int id, const char* name) const {
   return getAs<int>(id, name);
 }
-unsigned int KvCOptionValueStorage::getUnsignedIntOptionValueByEncodedName(
-    int id, const char* name) const {
+unsigned int KvCOptionValueStorage::getUnsignedIntOptionValueByEncodedName(int id,
+                                                                           const char* name) const {
   return getAs<unsigned int>(id, name);
 }
 double KvCOptionValueStorage::getDoubleOptionValueByEncodedName(int id, const char* name) const {

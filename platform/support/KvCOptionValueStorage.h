@@ -47,8 +47,7 @@ public:
                                                       const char* encodedName) const;
   double getDoubleOptionValueByEncodedName(int interfaceId, const char* encodedName) const;
   WmCXString getStringOptionValueByEncodedName(int interfaceId, const char* encodedName) const;
-  mxArray_tag* getMXArrayOptionValueByEncodedName(int interfaceId,
-                                                  const char* encodedName) const;
+  mxArray_tag* getMXArrayOptionValueByEncodedName(int interfaceId, const char* encodedName) const;
 
   bool setOptionValueByEncodedName(int interfaceId, const char* encodedName, bool value);
   bool setOptionValueByEncodedName(int interfaceId, const char* encodedName, int value);
@@ -58,14 +57,17 @@ public:
                                    const WmCXString& value);
   bool setOptionValueByEncodedName(int interfaceId, const char* encodedName,
                                    const mxArray_tag* value);
+  // A string literal would otherwise convert to bool; pass a WmCXString.
+  bool setOptionValueByEncodedName(int interfaceId, const char* encodedName,
+                                   const char* value) = delete;
 
   // Writes "decodedName = value" for every option of the interface, sorted by decoded
   // name; unset options show "<unset>". Nothing for an unknown id or a null dump.
   void dumpOptions(KV_Dump* dump, int interfaceId) const;
 
 private:
-  using Value = std::variant<std::monostate, bool, int, unsigned int, double, WmCXString,
-                             const mxArray_tag*>;
+  using Value =
+      std::variant<std::monostate, bool, int, unsigned int, double, WmCXString, const mxArray_tag*>;
   // Encoded name -> value, for one interface.
   using Options = std::map<std::string, Value, std::less<>>;
 
