@@ -1,0 +1,161 @@
+// The data types of the ICode: KV_DataType and its kinds, numerical types (integers and
+// floating point), pointers, structures and arrays. The classes form one family and are
+// kept together here.
+//
+// Types are made and owned by KV_DataTypeServer, which keeps one type per key: two
+// pointers to equal keys are the same object. A numerical type may exist under several
+// names (a base type and its typedefs): isEqualType compares structure (width,
+// signedness, pointed-to and element types), isEqualTypeRef compares identity.
+//
+// Each type owns its expression-location database, made on first demand.
+#ifndef HUL_PLATFORM_ICODE_KV_DATATYPE_H
+#define HUL_PLATFORM_ICODE_KV_DATATYPE_H
+
+#include "platform/support/HulPlatformExport.h"
+#include "platform/support/WmCXString.h"
+
+#include <cstdint>
+#include <memory>
+#include <vector>
+
+class KV_ArrayType;
+class KV_NumericalType;
+class KV_PointerType;
+class KV_StructType;
+class KvCExprLocDB;
+
+enum tagKvEDataTypeKind {
+  KV_TYPE_VOID,
+  KV_TYPE_NUMERICAL,
+  KV_TYPE_POINTER,
+  KV_TYPE_STRUCT,
+  KV_TYPE_ARRAY
+};
+
+class HUL_PLATFORM_API KV_DataType {
+public:
+  virtual ~KV_DataType();
+  KV_DataType(const KV_DataType&) = delete;
+  KV_DataType& operator=(const KV_DataType&) = delete;
+
+  const WmCXString& getName() const { return name; }
+  tagKvEDataTypeKind getTypeKind() const { return kind; }
+  // Creation order within the type server.
+  int getTypeId() const { return typeId; }
+
+  virtual KV_NumericalType* asNumericalType() { return nullptr; }
+  KV_NumericalType* getNumericalType() { return asNumericalType(); }
+  virtual KV_PointerType* asPointerType() { return nullptr; }
+  virtual KV_StructType* asStructType() { return nullptr; }
+  virtual KV_ArrayType* asArrayType() { return nullptr; }
+  virtual bool isFloat() const { return false; }
+
+  bool isEqualType(KV_DataType* other) const;
+  bool isEqualTypeRef(KV_DataType* other) const { return this == other; }
+
+  KvCExprLocDB* getExprLocDB();
+  // The database if it was made already, else null (no creation).
+  KvCExprLocDB* findExprLocDB() const { return db.get(); }
+
+protected:
+  KV_DataType(int id, tagKvEDataTypeKind k, WmCXString typeName);
+  virtual bool hasEqualStructure(const KV_DataType& other) const = 0;
+
+private:
+  int typeId;
+  tagKvEDataTypeKind kind;
+  WmCXString name;
+  std::unique_ptr<KvCExprLocDB> db;
+};
+
+class HUL_PLATFORM_API KV_VoidType : public KV_DataType {
+public:
+  KV_VoidType(int id, WmCXString typeName) : KV_DataType(id, KV_TYPE_VOID, std::move(typeName)) {}
+
+protected:
+  bool hasEqualStructure(const KV_DataType&) const override { return true; }
+};
+
+class HUL_PLATFORM_API KV_NumericalType : public KV_DataType {
+public:
+  KV_NumericalType(int id, WmCXString typeName, int bitWidth, bool signedType, bool floatType);
+
+  KV_NumericalType* asNumericalType() override { return this; }
+  bool isFloat() const override { return floating; }
+  int getBits() const { return bits; }
+  bool isSigned() const { return isSignedType; }
+  // Range handling does not apply to floating-point types and to types marked exempt.
+  bool isExemptFromRangeHandling() const { return floating || exempt; }
+  void setExemptFromRangeHandling(bool value) { exempt = value; }
+  // The limits of an integer type (0 for floating-point types).
+  std::int64_t getMinValue() const;
+  std::int64_t getMaxValue() const;
+
+protected:
+  bool hasEqualStructure(const KV_DataType& other) const override;
+
+private:
+  int bits;
+  bool isSignedType;
+  bool floating;
+  bool exempt = false;
+};
+
+class HUL_PLATFORM_API KV_PointerType : public KV_DataType {
+public:
+  KV_PointerType(int id, WmCXString typeName, KV_DataType* target, bool toConst);
+
+  KV_PointerType* asPointerType() override { return this; }
+  KV_DataType* getTargetType() const { return targetType; }
+  bool isPointerToConst() const { return pointerToConst; }
+
+protected:
+  bool hasEqualStructure(const KV_DataType& other) const override;
+
+private:
+  KV_DataType* targetType;
+  bool pointerToConst;
+};
+
+class HUL_PLATFORM_API KV_StructType : public KV_DataType {
+public:
+  struct Component {
+    WmCXString name;
+    KV_DataType* type;
+  };
+
+  KV_StructType(int id, WmCXString typeName)
+      : KV_DataType(id, KV_TYPE_STRUCT, std::move(typeName)) {}
+
+  KV_StructType* asStructType() override { return this; }
+  void addComponent(const WmCXString& componentName, KV_DataType* type);
+  int getNumberOfComponents() const { return static_cast<int>(components.size()); }
+  const Component& getComponent(int i) const { return components[static_cast<std::size_t>(i)]; }
+  // The type of the named component, or null.
+  KV_DataType* findComponentType(const WmCXString& componentName) const;
+
+protected:
+  // A structure equals only itself.
+  bool hasEqualStructure(const KV_DataType&) const override { return false; }
+
+private:
+  std::vector<Component> components;
+};
+
+class HUL_PLATFORM_API KV_ArrayType : public KV_DataType {
+public:
+  KV_ArrayType(int id, WmCXString typeName, KV_DataType* element, int elementCount);
+
+  KV_ArrayType* asArrayType() override { return this; }
+  KV_DataType* getElementType() const { return elementType; }
+  int getSize() const { return size; }
+
+protected:
+  bool hasEqualStructure(const KV_DataType& other) const override;
+
+private:
+  KV_DataType* elementType;
+  int size;
+};
+
+#endif

@@ -1,0 +1,46 @@
+// KV_ExprLocationFactory: makes expression locations and what they hold. Every location
+// is new and without parent; the code view data owns it.
+#ifndef HUL_PLATFORM_ICODE_KV_EXPRLOCATIONFACTORY_H
+#define HUL_PLATFORM_ICODE_KV_EXPRLOCATIONFACTORY_H
+
+#include "platform/icode/KV_Constant.h"
+#include "platform/support/WmCXString.h"
+
+#include <cstdint>
+#include <vector>
+
+class KvCCodeViewData;
+class KvCIcFileId;
+class KvCSmbInitValExpr;
+class KvCStringExpr;
+class KvCSymbol;
+
+class HUL_PLATFORM_API KV_ExprLocationFactory {
+public:
+  explicit KV_ExprLocationFactory(KvCCodeViewData* owner) : codeViewData(owner) {}
+
+  KV_ExprLocation* createEmpty();
+  // A location holding `expr`; null when `expr` is null or held elsewhere.
+  KV_ExprLocation* createFromExpression(KvCIcExpression* expr);
+  KV_ExprLocation* createFromOperation(KV_Operation* op);
+  // A location holding a new plain access to `symbol` (null for a null symbol).
+  KV_ExprLocation* createFromSymbol(KvCSymbol* symbol);
+  // A location holding a new constant (integral: signed, or unsigned when `isUnsigned`).
+  KV_ExprLocation* createFromValue(std::int64_t value, KV_DataType* type, bool isUnsigned = false);
+  KV_ExprLocation* createFromValue(double value, KV_DataType* type);
+  KV_ExprLocation* createFromString(const WmCXString& text, bool asCode, bool quoted);
+  KV_ExprLocation* createFromDataType(KV_DataType* type);
+  KV_ExprLocation* createFromFileId(KvCIcFileId* file);
+
+  KV_Constant* createConstant(tagKvEConstantType type, std::int64_t value, KV_DataType* dt);
+  KV_Constant* createDoubleConstant(double value, KV_DataType* dt);
+  KvCStringExpr* createString(const WmCXString& text, bool asCode, bool quoted);
+  // An initial value with the given dimension sizes (empty for a scalar); null for more
+  // than three dimensions or a size below 1.
+  KvCSmbInitValExpr* createInitValue(const std::vector<int>& dimensionSizes);
+
+private:
+  KvCCodeViewData* codeViewData;
+};
+
+#endif

@@ -1,0 +1,15 @@
+#include "platform/icode/KV_ICodeElem.h"
+
+#include "platform/icode/KV_ExprLocation.h"
+#include "platform/icode/KvCIcExpression.h"
+
+KV_ICodeElem::~KV_ICodeElem() = default;
+
+bool KV_ICodeElem::isWithin(const KV_ICodeElem* ancestor) const {
+  for (const KV_ICodeElem* e = this; e; e = e->getParentElem())
+    if (e == ancestor)
+      return true;
+  return false;
+}
+
+KV_ICodeElem* KvCIcExpression::getParentElem() const { return parentLocation; }

@@ -1,0 +1,39 @@
+// KV_ICodeFactoryContainer: where the passes get the ICode's factories and servers. Each
+// getter returns the one instance of the run; the code view data owns them all.
+#ifndef HUL_PLATFORM_ICODE_KV_ICODEFACTORYCONTAINER_H
+#define HUL_PLATFORM_ICODE_KV_ICODEFACTORYCONTAINER_H
+
+#include "platform/icode/KV_ExprLocationFactory.h"
+#include "platform/icode/KV_OperationFactory.h"
+#include "platform/icode/KV_QSOFactory.h"
+#include "platform/icode/KV_StatementFactory.h"
+
+class KV_DataTypeServer;
+class KV_ScalingServer;
+class KV_SymbolDB;
+class KvCIcFileServer;
+
+class HUL_PLATFORM_API KV_ICodeFactoryContainer {
+public:
+  explicit KV_ICodeFactoryContainer(KvCCodeViewData* owner);
+  KV_ICodeFactoryContainer(const KV_ICodeFactoryContainer&) = delete;
+  KV_ICodeFactoryContainer& operator=(const KV_ICodeFactoryContainer&) = delete;
+
+  KV_ExprLocationFactory* getExprLocFactory() { return &locations; }
+  KV_OperationFactory* getOperationFactory() { return &operations; }
+  KV_QSOFactory* getQSOFactory() { return &qsos; }
+  KV_StatementFactory* getStatementFactory() { return &statements; }
+  KV_DataTypeServer* getDataTypeServer() const;
+  KV_ScalingServer* getScalingServer() const;
+  KvCIcFileServer* getFileServer() const;
+  KV_SymbolDB* getSymbolDB() const;
+
+private:
+  KvCCodeViewData* codeViewData;
+  KV_ExprLocationFactory locations;
+  KV_OperationFactory operations;
+  KV_QSOFactory qsos;
+  KV_StatementFactory statements;
+};
+
+#endif

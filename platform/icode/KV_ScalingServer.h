@@ -1,0 +1,22 @@
+// KV_ScalingServer: makes and owns the scalings, one per (lsb, offset).
+#ifndef HUL_PLATFORM_ICODE_KV_SCALINGSERVER_H
+#define HUL_PLATFORM_ICODE_KV_SCALINGSERVER_H
+
+#include "platform/icode/KV_Scaling.h"
+
+#include <map>
+#include <memory>
+#include <utility>
+
+class HUL_PLATFORM_API KV_ScalingServer {
+public:
+  // Null for a non-finite or zero LSB, or a non-finite offset.
+  KV_Scaling* demandScaling(double lsb, double offset);
+  // LSB 1, offset 0.
+  KV_Scaling* getIdentityScaling() { return demandScaling(1.0, 0.0); }
+
+private:
+  std::map<std::pair<double, double>, std::unique_ptr<KV_Scaling>> scalings;
+};
+
+#endif

@@ -1,0 +1,42 @@
+// KV_SymbolDB: all symbols of the code view data, in creation order. It makes and owns
+// them, numbers them (debug index 1, 2, ...) and finds a symbol by name in O(1) (the
+// first one made with that name, when names repeat across scopes).
+#ifndef HUL_PLATFORM_ICODE_KV_SYMBOLDB_H
+#define HUL_PLATFORM_ICODE_KV_SYMBOLDB_H
+
+#include "platform/icode/KV_SmbDBObjVisitor.h"
+#include "platform/support/HulPlatformExport.h"
+#include "platform/support/WmCXString.h"
+
+#include <memory>
+#include <unordered_map>
+#include <vector>
+
+class KV_DataType;
+
+class HUL_PLATFORM_API KV_SymbolDB {
+public:
+  KV_SymbolDB();
+  ~KV_SymbolDB();
+  KV_SymbolDB(const KV_SymbolDB&) = delete;
+  KV_SymbolDB& operator=(const KV_SymbolDB&) = delete;
+
+  KvCParamSymbol* createParamSymbol(const WmCXString& name, KV_DataType* returnType, bool macro);
+  KvCUnparamSymbol* createUnparamSymbol(const WmCXString& name, KV_DataType* type, bool component);
+
+  KvCSymbol* findSymbol(const WmCXString& name) const;
+  int getNumberOfSymbols() const { return static_cast<int>(symbols.size()); }
+  KvCSymbol* getSymbol(int i) const { return symbols[static_cast<std::size_t>(i)].get(); }
+
+  // Calls the visitor once per function or macro symbol, in creation order.
+  void forallParametrizedSymbols(KV_SmbDBObjVisitor* visitor);
+
+private:
+  void enter(std::unique_ptr<KvCSymbol> symbol);
+
+  std::vector<std::unique_ptr<KvCSymbol>> symbols;
+  std::vector<KV_ParamSmbDBObj> paramEntries;
+  std::unordered_map<WmCXString, KvCSymbol*> byName;
+};
+
+#endif

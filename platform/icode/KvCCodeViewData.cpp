@@ -1,0 +1,109 @@
+#include "platform/icode/KvCCodeViewData.h"
+
+#include "platform/icode/KV_DataTypeServer.h"
+#include "platform/icode/KV_ICodeElem.h"
+#include "platform/icode/KV_ICodeFactoryContainer.h"
+#include "platform/icode/KV_ScalingServer.h"
+#include "platform/icode/KV_SymbolDB.h"
+#include "platform/icode/KvCExprLocDB.h"
+#include "platform/icode/KvCExprLocDBServer.h"
+#include "platform/icode/KvCIcApplication.h"
+#include "platform/icode/KvCIcFileServer.h"
+#include "platform/icode/KvCRtosProtection.h"
+#include "platform/icode/KvCSymbol.h"
+#include "platform/icode/KvCTaskActivation.h"
+#include "platform/support/KvCNameSpace.h"
+#include "platform/support/KvCSrcRefServer.h"
+
+KvCCodeViewData::KvCCodeViewData(const WmCXString& applicationName)
+    : application(std::make_unique<KvCIcApplication>(applicationName)),
+      srcRefServer(std::make_unique<KvCSrcRefServer>()),
+      typeServer(std::make_unique<KV_DataTypeServer>()),
+      scalingServer(std::make_unique<KV_ScalingServer>()),
+      fileServer(std::make_unique<KvCIcFileServer>(this)),
+      symbolDB(std::make_unique<KV_SymbolDB>()),
+      dbServer(std::make_unique<KvCExprLocDBServer>(this)),
+      factories(std::make_unique<KV_ICodeFactoryContainer>(this)) {
+  for (int l = 0; l < KV_CONV_NUMBER_OF_LEVELS; ++l)
+    levels[l] = std::make_unique<KV_OpConversionLevel>(static_cast<tagKvEConversionLevel>(l));
+}
+
+KvCCodeViewData::~KvCCodeViewData() = default;
+
+KV_OpConversionLevel* KvCCodeViewData::getConversionLevel(tagKvEConversionLevel level) const {
+  if (level < 0 || level >= KV_CONV_NUMBER_OF_LEVELS)
+    return nullptr;
+  return levels[level].get();
+}
+
+KvCIcSubApplication* KvCCodeViewData::createSubApplication(const WmCXString& name) {
+  subApplications.push_back(std::make_unique<KvCIcSubApplication>(name));
+  application->addSubApplication(subApplications.back().get());
+  return subApplications.back().get();
+}
+
+KvCIcCodeUnit* KvCCodeViewData::createCodeUnit(const WmCXString& name) {
+  codeUnits.push_back(std::make_unique<KvCIcCodeUnit>(name));
+  return codeUnits.back().get();
+}
+
+KvCTaskActivation* KvCCodeViewData::createTaskActivation(int kind, const WmCXString& taskName) {
+  taskActivations.push_back(
+      std::make_unique<KvCTaskActivation>(static_cast<tagKvETaskActivationKind>(kind), taskName));
+  return taskActivations.back().get();
+}
+
+KvCRtosProtection* KvCCodeViewData::createRtosProtection(const WmCXString& resourceName) {
+  protections.push_back(std::make_unique<KvCRtosProtection>(resourceName));
+  return protections.back().get();
+}
+
+KvCNameSpace* KvCCodeViewData::createNameSpace() {
+  nameSpaces.push_back(std::make_unique<KvCNameSpace>());
+  return nameSpaces.back().get();
+}
+
+void KvCCodeViewData::adoptElement(std::unique_ptr<KV_ICodeElem> elem) {
+  elements.push_back(std::move(elem));
+}
+
+KvCExprLocDB* KvCExprLocDBServer::demandExprLocDB(KV_DataType* type) {
+  return type ? type->getExprLocDB() : nullptr;
+}
+
+KvCExprLocDB* KvCExprLocDBServer::demandExprLocDB(KvCIcFileId* file) {
+  return file ? file->getExprLocDB() : nullptr;
+}
+
+void KvCExprLocDBServer::clearExprLocDBs() {
+  KV_SymbolDB* symbols = codeViewData->getSymbolDB();
+  for (int i = 0; i < symbols->getNumberOfSymbols(); ++i)
+    symbols->getSymbol(i)->getExprLocDB()->clear();
+  KV_DataTypeServer* types = codeViewData->getDataTypeServer();
+  for (int i = 0; i < types->getNumberOfTypes(); ++i)
+    if (KvCExprLocDB* db = types->getType(i)->findExprLocDB())
+      db->clear();
+  KvCIcFileServer* files = codeViewData->getFileServer();
+  for (int i = 0; i < files->getNumberOfFiles(); ++i)
+    if (KvCExprLocDB* db = files->getFile(i)->findExprLocDB())
+      db->clear();
+}
+
+KvCIcFileServer::~KvCIcFileServer() = default;
+
+KvCIcFileId* KvCIcFileServer::demandFile(const WmCXString& name) {
+  if (KvCIcFileId* existing = findFile(name))
+    return existing;
+  files.push_back(std::make_unique<KvCIcFileId>(getNumberOfFiles(), name));
+  KvCIcFileId* file = files.back().get();
+  byName.emplace(name, file);
+  KvCCStmTable* table =
+      codeViewData->getFactoryContainer()->getStatementFactory()->createCStmTable(nullptr, file);
+  file->getFile()->setStatementTable(table);
+  return file;
+}
+
+KvCIcFileId* KvCIcFileServer::findFile(const WmCXString& name) const {
+  auto it = byName.find(name);
+  return it == byName.end() ? nullptr : it->second;
+}

@@ -1,0 +1,88 @@
+// KvCCodeViewData: the root of one run's ICode. It owns every element, symbol, type,
+// scaling, file and server of the run, and hands out the application, the servers and the
+// factory container (each getter returns the one instance of the run).
+//
+// Elements are numbered in creation order (getSerial). Everything lives until the code
+// view data is destroyed; the model frees nothing earlier, so pointers into it stay valid
+// for the whole run.
+#ifndef HUL_PLATFORM_ICODE_KVCCODEVIEWDATA_H
+#define HUL_PLATFORM_ICODE_KVCCODEVIEWDATA_H
+
+#include "platform/icode/KV_OpConversionLevel.h"
+#include "platform/support/HulPlatformExport.h"
+#include "platform/support/WmCXString.h"
+
+#include <memory>
+#include <vector>
+
+class KV_DataTypeServer;
+class KV_ICodeElem;
+class KV_ICodeFactoryContainer;
+class KV_ScalingServer;
+class KV_SymbolDB;
+class KvCExprLocDBServer;
+class KvCIcApplication;
+class KvCIcCodeUnit;
+class KvCIcFileServer;
+class KvCIcSubApplication;
+class KvCNameSpace;
+class KvCRtosProtection;
+class KvCSrcRefServer;
+class KvCTaskActivation;
+
+class HUL_PLATFORM_API KvCCodeViewData {
+public:
+  explicit KvCCodeViewData(const WmCXString& applicationName = "Application");
+  ~KvCCodeViewData();
+  KvCCodeViewData(const KvCCodeViewData&) = delete;
+  KvCCodeViewData& operator=(const KvCCodeViewData&) = delete;
+
+  KvCIcApplication* getApplication() const { return application.get(); }
+  KvCExprLocDBServer* getExprLocDBServer() const { return dbServer.get(); }
+  KvCSrcRefServer* getSrcRefServer() const { return srcRefServer.get(); }
+  KV_SymbolDB* getSymbolDB() const { return symbolDB.get(); }
+  KV_DataTypeServer* getDataTypeServer() const { return typeServer.get(); }
+  KV_ScalingServer* getScalingServer() const { return scalingServer.get(); }
+  KvCIcFileServer* getFileServer() const { return fileServer.get(); }
+  KV_ICodeFactoryContainer* getFactoryContainer() const { return factories.get(); }
+  KV_OpConversionLevel* getConversionLevel(tagKvEConversionLevel level) const;
+
+  // Parts of the application tree and descriptors; owned here.
+  KvCIcSubApplication* createSubApplication(const WmCXString& name);
+  KvCIcCodeUnit* createCodeUnit(const WmCXString& name);
+  KvCTaskActivation* createTaskActivation(int kind, const WmCXString& taskName);
+  KvCRtosProtection* createRtosProtection(const WmCXString& resourceName);
+  KvCNameSpace* createNameSpace();
+
+  // The serial number the next element gets, and taking ownership of a new element.
+  int nextSerial() const { return static_cast<int>(elements.size()); }
+  template <class T> T* adopt(std::unique_ptr<T> elem) {
+    T* result = elem.get();
+    adoptElement(std::move(elem));
+    return result;
+  }
+  int getNumberOfElements() const { return static_cast<int>(elements.size()); }
+
+private:
+  void adoptElement(std::unique_ptr<KV_ICodeElem> elem);
+
+  // Elements are destroyed last: the databases of symbols, types and files reset the
+  // records of their locations when they go.
+  std::vector<std::unique_ptr<KV_ICodeElem>> elements;
+  std::unique_ptr<KvCIcApplication> application;
+  std::vector<std::unique_ptr<KvCIcSubApplication>> subApplications;
+  std::vector<std::unique_ptr<KvCIcCodeUnit>> codeUnits;
+  std::vector<std::unique_ptr<KvCTaskActivation>> taskActivations;
+  std::vector<std::unique_ptr<KvCRtosProtection>> protections;
+  std::vector<std::unique_ptr<KvCNameSpace>> nameSpaces;
+  std::unique_ptr<KV_OpConversionLevel> levels[KV_CONV_NUMBER_OF_LEVELS];
+  std::unique_ptr<KvCSrcRefServer> srcRefServer;
+  std::unique_ptr<KV_DataTypeServer> typeServer;
+  std::unique_ptr<KV_ScalingServer> scalingServer;
+  std::unique_ptr<KvCIcFileServer> fileServer;
+  std::unique_ptr<KV_SymbolDB> symbolDB;
+  std::unique_ptr<KvCExprLocDBServer> dbServer;
+  std::unique_ptr<KV_ICodeFactoryContainer> factories;
+};
+
+#endif

@@ -1,0 +1,130 @@
+#include "platform/icode/KvCExprLocDB.h"
+
+#include "platform/icode/KV_ExprLocation.h"
+#include "platform/icode/KV_Operation.h"
+#include "platform/icode/KV_Statement.h"
+#include "platform/icode/KvCCStmTable.h"
+#include "platform/icode/KvCParamSymbol.h"
+
+KvCExprLocDB::KvCExprLocDB() : qsoPart(this) {}
+
+KvCExprLocDB::~KvCExprLocDB() { clear(); }
+
+bool KvCExprLocDB::add(tagKvEExprLocDBCategory category, KV_ExprLocation* loc) {
+  if (!loc || category < 0 || category >= KV_DB_NUMBER_OF_CATEGORIES)
+    return false;
+  const bool defSide = isDefCategory(category);
+  KV_ExprLocation::DbSlot& slot = defSide ? loc->defSlot : loc->useSlot;
+  if (slot.db == this && slot.category == category)
+    return true;
+  if (slot.db)
+    slot.db->removeSide(defSide, loc);
+  std::vector<KV_ExprLocation*>& list = entries[category];
+  slot = KV_ExprLocation::DbSlot{this, category, static_cast<int>(list.size())};
+  list.push_back(loc);
+  return true;
+}
+
+bool KvCExprLocDB::removeSide(bool defSide, KV_ExprLocation* loc) {
+  if (!loc)
+    return false;
+  KV_ExprLocation::DbSlot& slot = defSide ? loc->defSlot : loc->useSlot;
+  if (slot.db != this)
+    return false;
+  std::vector<KV_ExprLocation*>& list = entries[slot.category];
+  KV_ExprLocation* last = list.back();
+  list[static_cast<std::size_t>(slot.position)] = last;
+  (defSide ? last->defSlot : last->useSlot).position = slot.position;
+  list.pop_back();
+  slot = KV_ExprLocation::DbSlot{};
+  return true;
+}
+
+bool KvCExprLocDB::removeDef(KV_ExprLocation* loc) { return removeSide(true, loc); }
+
+bool KvCExprLocDB::removeUse(KV_ExprLocation* loc) { return removeSide(false, loc); }
+
+void KvCExprLocDB::listRange(int first, int last,
+                             leda::dictionary<int, KV_ExprLocation*>& out) const {
+  out.clear();
+  for (int c = first; c <= last; ++c)
+    for (KV_ExprLocation* loc : entries[c])
+      out.insert(loc->getSerial(), loc);
+}
+
+void KvCExprLocDB::listDefs(leda::dictionary<int, KV_ExprLocation*>& defs) const {
+  listRange(KV_DB_DEF, KV_DB_QSO_DEF, defs);
+}
+
+void KvCExprLocDB::listUses(leda::dictionary<int, KV_ExprLocation*>& uses) const {
+  listRange(KV_DB_USE, KV_DB_QSO_USE, uses);
+}
+
+void KvCExprLocDB::listCategory(tagKvEExprLocDBCategory category,
+                                leda::dictionary<int, KV_ExprLocation*>& out) const {
+  if (category < 0 || category >= KV_DB_NUMBER_OF_CATEGORIES) {
+    out.clear();
+    return;
+  }
+  listRange(category, category, out);
+}
+
+int KvCExprLocDB::getCategorySize(tagKvEExprLocDBCategory category) const {
+  if (category < 0 || category >= KV_DB_NUMBER_OF_CATEGORIES)
+    return 0;
+  return static_cast<int>(entries[category].size());
+}
+
+int KvCExprLocDB::getNumberOfDefs() const {
+  int n = 0;
+  for (int c = KV_DB_DEF; c <= KV_DB_QSO_DEF; ++c)
+    n += static_cast<int>(entries[c].size());
+  return n;
+}
+
+int KvCExprLocDB::getNumberOfUses() const {
+  int n = 0;
+  for (int c = KV_DB_USE; c <= KV_DB_QSO_USE; ++c)
+    n += static_cast<int>(entries[c].size());
+  return n;
+}
+
+bool KvCExprLocDB::contains(tagKvEExprLocDBCategory category, const KV_ExprLocation* loc) const {
+  if (!loc || category < 0 || category >= KV_DB_NUMBER_OF_CATEGORIES)
+    return false;
+  const KV_ExprLocation::DbSlot& slot = isDefCategory(category) ? loc->defSlot : loc->useSlot;
+  return slot.db == this && slot.category == category;
+}
+
+void KvCExprLocDB::clear() {
+  for (int c = 0; c < KV_DB_NUMBER_OF_CATEGORIES; ++c) {
+    const bool defSide = isDefCategory(static_cast<tagKvEExprLocDBCategory>(c));
+    for (KV_ExprLocation* loc : entries[c])
+      (defSide ? loc->defSlot : loc->useSlot) = KV_ExprLocation::DbSlot{};
+    entries[c].clear();
+  }
+}
+
+bool KvCQsoExprLocDB::addStaticDeclDefDef(KV_ExprLocation* loc) {
+  return db->add(KV_DB_STATIC_DECLDEF_DEF, loc);
+}
+bool KvCQsoExprLocDB::addStaticDeclDefUse(KV_ExprLocation* loc) {
+  return db->add(KV_DB_STATIC_DECLDEF_USE, loc);
+}
+bool KvCQsoExprLocDB::addQsoDef(KV_ExprLocation* loc) { return db->add(KV_DB_QSO_DEF, loc); }
+bool KvCQsoExprLocDB::addQsoUse(KV_ExprLocation* loc) { return db->add(KV_DB_QSO_USE, loc); }
+bool KvCQsoExprLocDB::addRestartDef(KV_ExprLocation* loc) {
+  return db->add(KV_DB_RESTART_DEF, loc);
+}
+
+bool KvCQsoExprLocDB::isRestartDef(KV_ExprLocation* loc) {
+  if (!loc || !loc->getQualifiedSymbolOp())
+    return false;
+  KV_Operation* parent = loc->getParentOperation();
+  if (!parent || !parent->definesOperand(loc->getIndexInParent()))
+    return false;
+  KV_Statement* statement = loc->getStatement();
+  KvCCStmTable* table = statement ? statement->getParentCTable() : nullptr;
+  KvCParamSymbol* function = table ? table->getCodeBlockSymbol() : nullptr;
+  return function && function->isRestartFunction();
+}

@@ -1,0 +1,89 @@
+// KvCSymbol: a named object of the ICode: a function or macro (KvCParamSymbol) or a
+// variable or structure component (KvCUnparamSymbol).
+//
+// Every symbol has a debug index, unique in its symbol database and increasing in
+// creation order (the first symbol has 1), and owns its expression-location database.
+// Roles (step function, restart function, logging macro, ...) are flags the code
+// generator sets; the predicates and marks below read and set them. A symbol is
+// "selected" unless the code generator deselects it (for example a symbol of a library
+// that is not generated).
+#ifndef HUL_PLATFORM_ICODE_KVCSYMBOL_H
+#define HUL_PLATFORM_ICODE_KVCSYMBOL_H
+
+#include "platform/support/HulPlatformExport.h"
+#include "platform/support/WmCXString.h"
+
+#include <memory>
+
+class KV_DataType;
+class KV_Scaling;
+class KvCExprLocDB;
+class KvCParamSymbol;
+class KvCUnparamSymbol;
+
+enum tagKvESymbolRole : unsigned {
+  KV_ROLE_STEP_FUNCTION = 1u << 0,
+  KV_ROLE_RESTART_FUNCTION = 1u << 1,
+  KV_ROLE_INIT_FUNCTION = 1u << 2,
+  KV_ROLE_TERM_FUNCTION = 1u << 3,
+  KV_ROLE_LOG_MACRO = 1u << 4,
+  KV_ROLE_ACCESS_FUNCTION = 1u << 5,
+  KV_ROLE_RTE_API_MACRO = 1u << 6,
+  KV_ROLE_SIDE_EFFECT_FREE = 1u << 7,
+  KV_ROLE_RTOS_SCHEDULE_FCN = 1u << 8,
+  KV_ROLE_REUSE_MASTER = 1u << 9,
+  KV_ROLE_SF_EXTERN_C_USER = 1u << 10,
+  KV_ROLE_IMPORTED_CODE_BLOCK = 1u << 11,
+  KV_ROLE_DEFINES_VECTOR_WIDTH = 1u << 12,
+  KV_ROLE_REFERENCE_FORMAL = 1u << 13,
+  KV_ROLE_FORMAL_PARAMETER = 1u << 14,
+  KV_ROLE_TASK_FUNCTION = 1u << 15,
+};
+
+class HUL_PLATFORM_API KvCSymbol {
+public:
+  virtual ~KvCSymbol();
+  KvCSymbol(const KvCSymbol&) = delete;
+  KvCSymbol& operator=(const KvCSymbol&) = delete;
+
+  const WmCXString& getName() const { return name; }
+  int getDebugIndex() const { return debugIndex; }
+  KV_DataType* getDataType() const { return dataType; }
+  void setDataType(KV_DataType* type) { dataType = type; }
+  KV_Scaling* getScaling() const { return scaling; }
+  void setScaling(KV_Scaling* s) { scaling = s; }
+
+  virtual KvCParamSymbol* asParamSymbol() { return nullptr; }
+  virtual KvCUnparamSymbol* asUnparamSymbol() { return nullptr; }
+
+  KvCExprLocDB* getExprLocDB() const { return db.get(); }
+  bool isSelected() const { return selected; }
+  void setSelected(bool value) { selected = value; }
+
+  bool hasRole(tagKvESymbolRole role) const { return (roles & role) != 0; }
+  void setRole(tagKvESymbolRole role, bool value);
+
+  bool isStepFunction() const { return hasRole(KV_ROLE_STEP_FUNCTION); }
+  bool isRestartFunction() const { return hasRole(KV_ROLE_RESTART_FUNCTION); }
+  bool isInitFunction() const { return hasRole(KV_ROLE_INIT_FUNCTION); }
+  bool isTermFunction() const { return hasRole(KV_ROLE_TERM_FUNCTION); }
+  bool isLogMacro() const { return hasRole(KV_ROLE_LOG_MACRO); }
+  bool isSideEffectFreeFunction() const { return hasRole(KV_ROLE_SIDE_EFFECT_FREE); }
+  bool isRtosScheduleFcn() const { return hasRole(KV_ROLE_RTOS_SCHEDULE_FCN); }
+  void markAsSideEffectFreeFunction() { setRole(KV_ROLE_SIDE_EFFECT_FREE, true); }
+  void markAsRtosScheduleFcn() { setRole(KV_ROLE_RTOS_SCHEDULE_FCN, true); }
+
+protected:
+  KvCSymbol(int index, WmCXString symbolName, KV_DataType* type);
+
+private:
+  WmCXString name;
+  int debugIndex;
+  KV_DataType* dataType;
+  KV_Scaling* scaling = nullptr;
+  std::unique_ptr<KvCExprLocDB> db;
+  unsigned roles = 0;
+  bool selected = true;
+};
+
+#endif
