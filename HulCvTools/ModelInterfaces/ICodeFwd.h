@@ -1,0 +1,40 @@
+// Forward declarations of the ICode model's classes, for the library's headers. The
+// library reaches the ICode only through this folder.
+#ifndef HULCVTOOLS_MODELINTERFACES_ICODEFWD_H
+#define HULCVTOOLS_MODELINTERFACES_ICODEFWD_H
+
+class KV_Constant;
+class KV_DataType;
+class KV_ExprLocation;
+class KV_ICodeElem;
+class KV_ICodeElemVisitor;
+class KV_ICodeFactoryContainer;
+class KV_OpConversionLevel;
+class KV_OpOperator;
+class KV_Operation;
+class KV_PointerType;
+class KV_QualifiedSymbolOp;
+class KV_Scaling;
+class KV_Statement;
+class KV_StatementTable;
+class KV_SymbolDB;
+class KvCCStmTable;
+class KvCCallOperation;
+class KvCCodeBlockOperation;
+class KvCCodeViewData;
+class KvCExprLocDB;
+class KvCExprLocDBServer;
+class KvCFcgFunctionInfo;
+class KvCICodeIterator;
+class KvCIcExprEqualitySpec;
+class KvCIcExpression;
+class KvCIcFile;
+class KvCIcFileId;
+class KvCParamSymbol;
+class KvCQsoExprLocDB;
+class KvCSmbInitValExpr;
+class KvCStringExpr;
+class KvCSymbol;
+class KvCUnparamSymbol;
+
+#endif

@@ -1,0 +1,10 @@
+// Forward declarations of the intermediate view's classes (partitions, RTOS database).
+// The library reaches the view only through this folder.
+#ifndef HULCVTOOLS_MODELINTERFACES_VIEWFWD_H
+#define HULCVTOOLS_MODELINTERFACES_VIEWFWD_H
+
+class KV_BdPartition;
+class KvCIvData;
+class KvCRoDatabase;
+
+#endif
