@@ -60,8 +60,9 @@ KV_ArrayType* AppBuilder::arrayOf(KV_DataType* element, int size) {
   return check(cvd->getDataTypeServer()->demandArrayType(element, size), "array type");
 }
 
-KV_StructType* AppBuilder::structType(
-    const char* name, std::initializer_list<std::pair<const char*, KV_DataType*>> components) {
+KV_StructType*
+AppBuilder::structType(const char* name,
+                       std::initializer_list<std::pair<const char*, KV_DataType*>> components) {
   KV_StructType* type = check(cvd->getDataTypeServer()->demandStructType(name), "struct type");
   if (type->getNumberOfComponents() == 0)
     for (const auto& [componentName, componentType] : components)
@@ -163,8 +164,7 @@ KvCUnparamSymbol* FunctionBuilder::addFormal(const char* name, KV_DataType* type
 
 KvCUnparamSymbol* FunctionBuilder::formal(int i) {
   while (getNumberOfFormals() <= i) {
-    const std::string name =
-        fn->getName().str() + "_p" + std::to_string(getNumberOfFormals());
+    const std::string name = fn->getName().str() + "_p" + std::to_string(getNumberOfFormals());
     addFormal(name.c_str(), app.int16());
   }
   return formals[static_cast<std::size_t>(i)];
@@ -176,7 +176,8 @@ KV_ExprLocation* AppBuilder::access(KvCSymbol* symbol) {
   return check(factories().getExprLocFactory()->createFromSymbol(symbol), "access to null symbol");
 }
 
-KV_ExprLocation* AppBuilder::element(KvCSymbol* array, std::initializer_list<BuilderIndex> indices) {
+KV_ExprLocation* AppBuilder::element(KvCSymbol* array,
+                                     std::initializer_list<BuilderIndex> indices) {
   KV_QualifiedSymbolOp* qso = check(factories().getQSOFactory()->createQso(array), "element");
   for (const BuilderIndex& index : indices) {
     if (!index.loc) {
@@ -257,18 +258,19 @@ KV_ExprLocation* AppBuilder::call(KvCParamSymbol* fn,
   return call(fn, std::vector<KV_ExprLocation*>(actuals));
 }
 
-KV_ExprLocation* AppBuilder::call(KvCParamSymbol* fn, const std::vector<KV_ExprLocation*>& actuals) {
+KV_ExprLocation* AppBuilder::call(KvCParamSymbol* fn,
+                                  const std::vector<KV_ExprLocation*>& actuals) {
   check(fn, "call of a null function");
-  KvCCallOperation* c = check(factories().getOperationFactory()->createCallOperation(fn, {}),
-                              "call operation");
+  KvCCallOperation* c =
+      check(factories().getOperationFactory()->createCallOperation(fn, {}), "call operation");
   auto it = functionsByName.find(fn->getName().str());
   for (std::size_t i = 0; i < actuals.size(); ++i) {
     KvCSymbol* formalSymbol = nullptr;
     if (it != functionsByName.end() && it->second->symbol() == fn)
       formalSymbol = it->second->formal(static_cast<int>(i));
     else
-      formalSymbol = variable((fn->getName().str() + "_p" + std::to_string(i)).c_str(), int16(),
-                              false);
+      formalSymbol =
+          variable((fn->getName().str() + "_p" + std::to_string(i)).c_str(), int16(), false);
     if (!c->appendOperand(parameter(access(formalSymbol), actuals.begin()[i])))
       fail("call: parameter cannot be attached");
   }
@@ -323,7 +325,8 @@ KV_ExprLocation* AppBuilder::funcDecl(KvCParamSymbol* fn) {
                      {access(fn), typeRef(fn->getDataType()), fileRef(current)});
 }
 
-KV_ExprLocation* AppBuilder::typeDef(KV_DataType* defined, std::initializer_list<KV_DataType*> used) {
+KV_ExprLocation* AppBuilder::typeDef(KV_DataType* defined,
+                                     std::initializer_list<KV_DataType*> used) {
   std::vector<KV_ExprLocation*> operands{typeRef(defined)};
   for (KV_DataType* t : used)
     operands.push_back(typeRef(t));
@@ -359,8 +362,8 @@ KvCRtosProtection* AppBuilder::protection(const char* resource) {
 // --- blocks
 
 KV_Statement* BlockBuilder::stmt(KV_ExprLocation* root) {
-  KV_Statement* statement = app.check(
-      app.factories().getStatementFactory()->createStatement(root), "statement root used twice");
+  KV_Statement* statement = app.check(app.factories().getStatementFactory()->createStatement(root),
+                                      "statement root used twice");
   if (!stmTable->appendStatement(statement))
     app.fail("statement cannot be appended");
   last = statement;

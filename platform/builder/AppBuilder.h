@@ -21,6 +21,7 @@
 #include "platform/icode/KV_DataType.h"
 #include "platform/icode/KV_OpOperator.h"
 #include "platform/icode/KvCCodeViewData.h"
+#include "platform/icode/KvCUnparamSymbol.h"
 
 #include <cstdint>
 #include <deque>
@@ -43,7 +44,7 @@ class KvCRtosProtection;
 
 // One index of an array access: a constant or an index expression.
 struct BuilderIndex {
-  BuilderIndex(int constant) : value(constant) {} // NOLINT: reads like a[1]
+  BuilderIndex(int constant) : value(constant) {}                // NOLINT: reads like a[1]
   BuilderIndex(KV_ExprLocation* expression) : loc(expression) {} // NOLINT: reads like a[i]
   int value = 0;
   KV_ExprLocation* loc = nullptr;
@@ -123,7 +124,9 @@ public:
   KV_ExprLocation* logAnd(KV_ExprLocation* a, KV_ExprLocation* b) {
     return op(KV_OP_LOG_AND, {a, b});
   }
-  KV_ExprLocation* logOr(KV_ExprLocation* a, KV_ExprLocation* b) { return op(KV_OP_LOG_OR, {a, b}); }
+  KV_ExprLocation* logOr(KV_ExprLocation* a, KV_ExprLocation* b) {
+    return op(KV_OP_LOG_OR, {a, b});
+  }
   KV_ExprLocation* logNot(KV_ExprLocation* a) { return op(KV_OP_LOG_NOT, {a}); }
   KV_ExprLocation* bitAnd(KV_ExprLocation* a, KV_ExprLocation* b) {
     return op(KV_OP_BIT_AND, {a, b});

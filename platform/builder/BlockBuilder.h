@@ -25,7 +25,8 @@ public:
   KV_Statement* stmt(KV_ExprLocation* root);
   KV_Statement* assign(KV_ExprLocation* lhs, KV_ExprLocation* rhs);
   KV_Statement* call(KvCParamSymbol* function, std::initializer_list<KV_ExprLocation*> actuals);
-  KV_Statement* activateTask(KvCParamSymbol* task, tagKvETaskActivationKind kind = KV_TASK_ACTIVATE);
+  KV_Statement* activateTask(KvCParamSymbol* task,
+                             tagKvETaskActivationKind kind = KV_TASK_ACTIVATE);
   KV_Statement* ret(KV_ExprLocation* value = nullptr);
 
   // for (init; cond; incr) { body }: the root is ForLoop(init, LoopCondition(cond), incr).
