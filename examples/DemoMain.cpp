@@ -1,9 +1,11 @@
 // The HulCvTools demo: boots the library against an option value storage, runs each
 // subsystem's section and shuts down, all under a counting memory controller that must
 // get every block back.
+#include "DemoSampleApp.h"
 #include "DemoSections.h"
 
 #include "HulCvTools/Control/KvCCvToolsControl.h"
+#include "platform/icode/KV_SymbolDB.h"
 #include "platform/support/KvCCountingMemController.h"
 #include "platform/support/KvCOptionValueStorage.h"
 
@@ -26,8 +28,15 @@ int main() {
   }
   out << "boot: " << (control->boot(&storage) ? "ok" : "failed") << "\n";
 
-  DemoRun run{out, storage, *control};
-  demoControl(run);
+  {
+    DemoSampleApp sample;
+    DemoRun run{out, storage, *control, sample};
+    demoControl(run);
+    out << "\nsample application: " << sample.app.data().getSymbolDB()->getNumberOfSymbols()
+        << " symbols, " << sample.app.data().getNumberOfElements() << " ICode elements\n";
+    demoElocQuery(run);
+    demoExprLocDB(run);
+  }
 
   printSectionTitle(out, "Shutdown");
   out << "shutdown: " << (control->shutdown() ? "ok" : "failed") << "\n";

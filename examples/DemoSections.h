@@ -8,17 +8,24 @@
 
 class KvCCvToolsControl;
 class KvCOptionValueStorage;
+struct DemoSampleApp;
 
-// What the sections share: the booted control object and the run's option storage.
+// What the sections share: the booted control object, the run's option storage and the
+// sample application.
 struct DemoRun {
   std::ostream& out;
   KvCOptionValueStorage& storage;
   KvCCvToolsControl& control;
+  DemoSampleApp& sample;
 };
 
 void printSectionTitle(std::ostream& out, const char* title);
 
 // Library frame: options, messages, internal checks.
 void demoControl(DemoRun& run);
+// Where locations stand and what they take part in.
+void demoElocQuery(DemoRun& run);
+// Definitions and uses of a variable; a repeated expression.
+void demoExprLocDB(DemoRun& run);
 
 #endif

@@ -56,10 +56,23 @@ void KV_ExprLocation::dropContent() {
   fileRef = nullptr;
 }
 
+bool KV_ExprLocation::liesInElementOf(KvCIcExpression* expr) const {
+  // The elements of an initial value that no location holds have no parent: such an
+  // element is the top of any tree below it.
+  KV_ICodeElem* top = parent;
+  if (!top)
+    return false;
+  while (KV_ICodeElem* up = top->getParentElem())
+    top = up;
+  KvCIcExpression* topExpr = top->asExpression();
+  return topExpr && topExpr->containingInitValue == expr;
+}
+
 bool KV_ExprLocation::setExpression(KvCIcExpression* expr) {
   if (expr == expression && expr)
     return true;
-  if (expr && (expr->parentLocation || isWithin(expr)))
+  if (expr && (expr->parentLocation || expr->containingInitValue || isWithin(expr) ||
+               liesInElementOf(expr)))
     return false;
   dropContent();
   expression = expr;

@@ -62,8 +62,8 @@ public:
   KV_Statement* getStatement() const;
 
   // Replace what the location holds. The old expression (if any) is left without parent.
-  // False, and nothing changed, when `expr` is held by another location already or would
-  // contain this location.
+  // False, and nothing changed, when `expr` is held by another location already, is an
+  // element of an initial value, or would contain this location.
   bool setExpression(KvCIcExpression* expr);
   void setDataTypeRef(KV_DataType* type);
   void setFileIdRef(KvCIcFileId* file);
@@ -93,6 +93,8 @@ private:
   }
   void detach() { attach(nullptr, -1); }
   void dropContent();
+  // Whether this location lies within an element of the initial value `expr`. O(depth).
+  bool liesInElementOf(KvCIcExpression* expr) const;
 
   KvCIcExpression* expression = nullptr;
   KV_DataType* typeRef = nullptr;

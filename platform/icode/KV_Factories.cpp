@@ -36,7 +36,7 @@ KV_ExprLocation* KV_ExprLocationFactory::createEmpty() {
 }
 
 KV_ExprLocation* KV_ExprLocationFactory::createFromExpression(KvCIcExpression* expr) {
-  if (!expr || expr->getParent())
+  if (!expr || expr->getParent() || expr->getContainingInitValue())
     return nullptr;
   KV_ExprLocation* loc = createEmpty();
   loc->setExpression(expr);

@@ -10,6 +10,9 @@ KV_QualifiedSymbolOp::KV_QualifiedSymbolOp(int serialNumber, KvCSymbol* accessed
 int KV_QualifiedSymbolOp::getIndexForDim(int dim, int /*unused*/) const {
   if (dim < 0 || dim >= getResolvedNumberOfDims() || getOperand(dim))
     return -1;
+  // A dimension added as a plain operand (appendOperand) has no recorded constant.
+  if (static_cast<std::size_t>(dim) >= constantIndices.size())
+    return -1;
   return constantIndices[static_cast<std::size_t>(dim)];
 }
 

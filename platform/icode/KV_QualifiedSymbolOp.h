@@ -22,8 +22,9 @@ public:
   void setBaseSymbol(KvCSymbol* base) { baseSymbol = base; }
 
   int getResolvedNumberOfDims() const { return getNumberOfOperands(); }
-  // The constant index of `dim`, or -1 when the dimension has an index expression (or
-  // does not exist).
+  // The constant index of `dim`, or -1 when the dimension has an index expression, has
+  // no constant recorded (an empty slot added through the operation interface), or does
+  // not exist.
   int getIndexForDim(int dim, int unused = 0) const;
   KV_ExprLocation* getIndexElocForDim(int dim) const { return getOperand(dim); }
   // Appends a dimension. addIndexEloc answers false when the location cannot be attached.

@@ -60,34 +60,39 @@ void visitContent(KV_ExprLocation* loc, KV_ICodeElemVisitor* visitor,
     visitor->visitSmbInitValExpr(init);
 }
 
-void visitOperationNode(KV_Operation* op, KV_ICodeElemVisitor* visitor) {
+// False when the visitor ended the walk.
+bool visitOperationNode(KV_Operation* op, KV_ICodeElemVisitor* visitor) {
   if (KV_QualifiedSymbolOp* qso = op->asQualifiedSymbolOp()) {
     visitor->visitQSO(qso);
+    if (visitor->stopIteration())
+      return false;
     visitor->visitSymbol(qso->getSymbol());
   } else if (KvCCodeBlockOperation* block = op->asCodeBlockOperation()) {
     visitor->visitCodeBlockOperation(block);
   } else {
     visitor->visitOperation(op);
   }
+  return true;
 }
 
 } // namespace
 
-void KvCICodeIterator::walk(KV_ICodeElem* start, KV_ICodeElemVisitor* visitor) {
+bool KvCICodeIterator::walk(KV_ICodeElem* start, KV_ICodeElemVisitor* visitor) {
   // Local, so that a visitor may start another walk with this iterator.
   std::vector<KV_ICodeElem*> stack{start};
   while (!stack.empty()) {
     KV_ICodeElem* elem = stack.back();
     stack.pop_back();
     if (visitor->stopIteration())
-      return;
+      return true;
     if (KV_ExprLocation* loc = elem->asExprLocation()) {
       visitor->visitExprLocation(loc);
       if (visitor->stopIteration())
-        break;
+        return true;
       visitContent(loc, visitor, stack);
     } else if (KV_Operation* op = elem->asOperation()) {
-      visitOperationNode(op, visitor);
+      if (!visitOperationNode(op, visitor))
+        return true;
       for (int i = op->getNumberOfOperands() - 1; i >= 0; --i)
         if (KV_ExprLocation* operand = op->getOperand(i))
           stack.push_back(operand);
@@ -106,6 +111,7 @@ void KvCICodeIterator::walk(KV_ICodeElem* start, KV_ICodeElemVisitor* visitor) {
         stack.push_back(table->getStatement(i));
     }
   }
+  return false;
 }
 
 bool KvCICodeIterator::iterate(KvCIcApplication* app, KV_ICodeElemVisitor* visitor) {
@@ -126,8 +132,9 @@ bool KvCICodeIterator::iterate(KvCIcApplication* app, KV_ICodeElemVisitor* visit
         if (visitor->stopIteration())
           return true;
         visitor->visitIcFileId(file);
-        if (KvCCStmTable* table = file->getFile()->getStatementTable())
-          walk(table, visitor);
+        KvCCStmTable* table = file->getFile()->getStatementTable();
+        if (table && walk(table, visitor))
+          return true;
       }
     }
   }

@@ -34,7 +34,8 @@ public:
   bool iterateExprLoc(KV_ExprLocation* loc, KV_ICodeElemVisitor* visitor);
 
 private:
-  void walk(KV_ICodeElem* start, KV_ICodeElemVisitor* visitor);
+  // True when the visitor ended the walk.
+  bool walk(KV_ICodeElem* start, KV_ICodeElemVisitor* visitor);
 
   bool omitFunctionBodies = false;
 };

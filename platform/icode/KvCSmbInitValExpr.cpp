@@ -1,5 +1,7 @@
 #include "platform/icode/KvCSmbInitValExpr.h"
 
+#include "platform/icode/KV_ExprLocation.h"
+
 bool KvCSmbInitValExprIterator::isDone() const {
   return !initValue || position >= initValue->elements.size();
 }
@@ -28,12 +30,14 @@ KvCIcExpression* KvCSmbInitValExpr::get(int i, int j, int k) const {
 }
 
 bool KvCSmbInitValExpr::addElement(KvCIcExpression* element) {
-  if (!element || element == this || element->getParent() || elements.size() >= capacity())
+  if (!element || element == this || element->getParent() || element->containingInitValue ||
+      elements.size() >= capacity())
     return false;
-  for (KvCIcExpression* e : elements)
-    if (e == element)
-      return false;
+  // Its parent would be the holder: refused when the holder lies within it.
+  if (getParent() && getParent()->isWithin(element))
+    return false;
   elements.push_back(element);
+  element->containingInitValue = this;
   element->parentLocation = getParent();
   return true;
 }

@@ -42,8 +42,9 @@ public:
   KvCIcExpression* get(int i, int j, int k) const;
   KvCSmbInitValExprIterator createIterator() const { return KvCSmbInitValExprIterator(this); }
 
-  // Appends an element in storage order. False for null, an expression held elsewhere, or
-  // when the value is full.
+  // Appends an element in storage order. False for null, an expression held elsewhere (by
+  // a location or as an element of an initial value), an expression that contains the
+  // location holding this value, or when the value is full.
   bool addElement(KvCIcExpression* element);
 
 private:
