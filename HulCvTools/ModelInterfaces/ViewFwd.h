@@ -4,6 +4,7 @@
 #define HULCVTOOLS_MODELINTERFACES_VIEWFWD_H
 
 class KV_BdPartition;
+class KvCCbActualInterface;
 class KvCIvData;
 class KvCRoDatabase;
 

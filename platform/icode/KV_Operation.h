@@ -13,6 +13,7 @@
 #include <vector>
 
 class KV_OpConversionLevel;
+class KvCSrcRef;
 class KV_Scaling;
 class KvCCallOperation;
 class KvCCodeBlockOperation;
@@ -44,6 +45,9 @@ public:
   void setScaling(KV_Scaling* s) { scaling = s; }
   KV_OpConversionLevel* getConversionLevel() const { return conversionLevel; }
   void setConversionLevel(KV_OpConversionLevel* level) { conversionLevel = level; }
+  // Where the operation came from, or null. Not owned.
+  const KvCSrcRef* getSourceRef() const { return srcRef; }
+  void setSourceRef(const KvCSrcRef* ref) { srcRef = ref; }
 
   // Puts `loc` (or nothing, for null) at position i; i == getNumberOfOperands() appends.
   // The old operand is left without parent. False, and nothing changed, for a position
@@ -57,6 +61,7 @@ private:
   KV_DataType* dataType = nullptr;
   KV_Scaling* scaling = nullptr;
   KV_OpConversionLevel* conversionLevel = nullptr;
+  const KvCSrcRef* srcRef = nullptr;
 };
 
 #endif

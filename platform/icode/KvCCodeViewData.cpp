@@ -15,6 +15,21 @@
 #include "platform/support/KvCNameSpace.h"
 #include "platform/support/KvCSrcRefServer.h"
 
+#include <algorithm>
+
+namespace {
+// The live code view data in order of creation; the last one is the current one.
+std::vector<KvCCodeViewData*>& liveCodeViewData() {
+  static std::vector<KvCCodeViewData*> live;
+  return live;
+}
+} // namespace
+
+KvCCodeViewData* KvCCodeViewData::getCurrent() {
+  const std::vector<KvCCodeViewData*>& live = liveCodeViewData();
+  return live.empty() ? nullptr : live.back();
+}
+
 KvCCodeViewData::KvCCodeViewData(const WmCXString& applicationName)
     : application(std::make_unique<KvCIcApplication>(applicationName)),
       srcRefServer(std::make_unique<KvCSrcRefServer>()),
@@ -26,9 +41,13 @@ KvCCodeViewData::KvCCodeViewData(const WmCXString& applicationName)
       factories(std::make_unique<KV_ICodeFactoryContainer>(this)) {
   for (int l = 0; l < KV_CONV_NUMBER_OF_LEVELS; ++l)
     levels[l] = std::make_unique<KV_OpConversionLevel>(static_cast<tagKvEConversionLevel>(l));
+  liveCodeViewData().push_back(this);
 }
 
-KvCCodeViewData::~KvCCodeViewData() = default;
+KvCCodeViewData::~KvCCodeViewData() {
+  std::vector<KvCCodeViewData*>& live = liveCodeViewData();
+  live.erase(std::remove(live.begin(), live.end(), this), live.end());
+}
 
 KV_OpConversionLevel* KvCCodeViewData::getConversionLevel(tagKvEConversionLevel level) const {
   if (level < 0 || level >= KV_CONV_NUMBER_OF_LEVELS)

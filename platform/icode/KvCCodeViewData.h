@@ -32,8 +32,14 @@ class KvCTaskActivation;
 
 class HUL_PLATFORM_API KvCCodeViewData {
 public:
+  // The new code view data becomes the current one of the process.
   explicit KvCCodeViewData(const WmCXString& applicationName = "Application");
   ~KvCCodeViewData();
+
+  // The code view data of the run: the most recently made one still alive, or null. The
+  // ICode's services that take no model argument (the symbol database of a call graph's
+  // construction) reach the run through it.
+  static KvCCodeViewData* getCurrent();
   KvCCodeViewData(const KvCCodeViewData&) = delete;
   KvCCodeViewData& operator=(const KvCCodeViewData&) = delete;
 

@@ -22,6 +22,10 @@ public:
 
   leda::set<KvCCallOperation*>& getCallOperationsSet() { return callOperations; }
   leda::set<KvCParamSymbol*>& getCalledFunctionsSet() { return calledFunctions; }
+  // Each answers whether the set changed.
+  bool addCallOperation(KvCCallOperation* call) { return call && callOperations.insert(call); }
+  bool delCallOperation(KvCCallOperation* call) { return call && callOperations.del(call); }
+  bool addCalledFcn(KvCFcgFunctionInfo* called);
 
   bool isInLoop() const { return inLoop; }
   void markInLoop() { inLoop = true; }

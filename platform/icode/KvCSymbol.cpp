@@ -42,3 +42,7 @@ int compareFunctionsByDebugIndex(KvCParamSymbol* const& a, KvCParamSymbol* const
 KvCFcgFunctionInfo::KvCFcgFunctionInfo(KvCParamSymbol* owner)
     : symbol(owner), callOperations(&compareCallsBySerial),
       calledFunctions(&compareFunctionsByDebugIndex) {}
+
+bool KvCFcgFunctionInfo::addCalledFcn(KvCFcgFunctionInfo* called) {
+  return called && called->symbol && calledFunctions.insert(called->symbol);
+}

@@ -1,0 +1,131 @@
+// KvCGenericFunctionCallGraph: the directed call graph of the application: one node per
+// function or macro, one edge per ordered pair (calling, called) linked by at least one
+// call operation, the edge's cardinality counting those operations. A self-recursive
+// call is a self-loop. Built from the ICode (construct, from the uses in the def/use
+// databases, which must be built first), then kept up to date call by call (addCall,
+// delCall), and walked with functors.
+//
+// Ownership: node payloads are the model's function infos, which the graph never frees;
+// nodes once made stay until shutdown of a derived graph (a new construct reuses them).
+// Edge infos belong to the graph (createFcgEdgeInfo / deleteFcgEdgeInfo). Copying is
+// deleted: a copied node map would point into the source graph.
+//
+// Lookups are O(1): next to the node map the graph keeps an index from (calling node,
+// called node) to the pair's edge, so a scheduler calling N functions is entered in O(N).
+// An edge that is hidden counts as absent for getEdge, as a scan of visible out-edges
+// would find it.
+//
+// The virtual hooks let derived graphs (recursion analysis, reuse graph) change what the
+// nodes and edges carry.
+#ifndef HULCVTOOLS_FCNCALLGRAPH_KVCGENERICFUNCTIONCALLGRAPH_H
+#define HULCVTOOLS_FCNCALLGRAPH_KVCGENERICFUNCTIONCALLGRAPH_H
+
+#include "HulCvTools/Control/KvCHeapObject.h"
+#include "HulCvTools/FcnCallGraph/KvCFcgEdgeInfo.h"
+#include "HulCvTools/FcnCallGraph/KvCFcgFunctor.h"
+#include "HulCvTools/HulCvToolsExport.h"
+#include "HulCvTools/ModelInterfaces/ICodeFwd.h"
+#include "platform/leda/graph.h"
+#include "platform/leda/list.h"
+#include "platform/leda/map.h"
+#include "platform/leda/set.h"
+
+#include <cstddef>
+#include <unordered_map>
+#include <utility>
+
+class KvCFcnSmbVisitor;
+
+// The graph of every call graph: instantiated (and exported) once, by the library.
+extern template class HULCV_API leda::GRAPH<KvCFcgFunctionInfo*, KvCFcgEdgeInfo*>;
+using KvCFcgGraph = leda::GRAPH<KvCFcgFunctionInfo*, KvCFcgEdgeInfo*>;
+
+class HULCV_API KvCGenericFunctionCallGraph : public KvCFcgGraph {
+public:
+  KvCGenericFunctionCallGraph();
+  // Releases the edge infos; the function infos are the model's.
+  ~KvCGenericFunctionCallGraph() override;
+  KvCGenericFunctionCallGraph(const KvCGenericFunctionCallGraph&) = delete;
+  KvCGenericFunctionCallGraph& operator=(const KvCGenericFunctionCallGraph&) = delete;
+
+  // Rebuilds the edges from the ICode: every function or macro symbol (only the selected
+  // ones when `onlySelected`) gets a node, and every use of it that is the called symbol
+  // of a call operation enters that call. False when a use had no operation (the graph
+  // built so far stays usable). Needs the run's current code view data.
+  virtual bool construct(bool onlySelected);
+  virtual void forall_FcgNodes(KvCFcgFunctor& functor);
+  virtual void forall_CallerNodes(KvCFcgFunctor& functor);
+  virtual void forall_CallingFunctionsOf(KvCFcgFunctionInfo* function, KvCFcgFunctor& functor);
+  virtual void forall_CalledNodes(KvCFcgFunctor& functor);
+  virtual void forall_CalledFunctionsOf(KvCFcgFunctionInfo* function, KvCFcgFunctor& functor);
+
+  // Enters one call operation: its (calling, called) edge, the call in the called
+  // function's set of calls, the called function in the caller's set of called functions.
+  // False, entering nothing, for a call outside every function (after an internal check,
+  // except for access functions and RTE API macros in initial values).
+  bool addCall(KvCCallOperation* call);
+  // Takes one call operation out: the edge's cardinality goes down, the edge goes at 0.
+  // False, changing nothing, when the graph has no edge for the call.
+  bool delCall(KvCCallOperation* call);
+
+  // `node` untouched on false.
+  bool getNode(KvCFcgFunctionInfo* function, leda::node& node) const;
+  // `edge` meaningful only on true.
+  bool getEdge(KvCFcgFunctionInfo* calling, KvCFcgFunctionInfo* called, leda::edge& edge) const;
+  // Edges, not call operations; 0 without node.
+  int getNrOfCallers(KvCFcgFunctionInfo* function) const;
+  int getNrOfCalled(KvCFcgFunctionInfo* function) const;
+  // Deletes every edge incident to the function's node; the node stays.
+  void removeEdges(KvCFcgFunctionInfo* function);
+  // Deletes the function's outgoing edges, emptying each called function's whole set of
+  // call operations (its calls from every caller).
+  void removeCalledEdges(KvCFcgFunctionInfo* function);
+  // The nodes without outgoing / incoming edges, in node order; true when there are any.
+  bool findAllFcgLeaves(leda::list<leda::node>& leaves) const;
+  bool findAllFcgRoots(leda::list<leda::node>& roots) const;
+  // Diagnostic output; prints nothing in this build.
+  void display() const {}
+  void display(const leda::set<leda::node>& nodes, int depth) const;
+
+protected:
+  virtual KvCFcgFunctionInfo* provideFcgNodeInfo(KvCParamSymbol* function);
+  virtual void deleteFcgNodeInfo(KvCFcgFunctionInfo* function);
+  virtual void synchronizeNodeInfoAtConstruction(KvCFcgFunctionInfo* info,
+                                                 KvCParamSymbol* function);
+  virtual KvCFcgEdgeInfo* createFcgEdgeInfo();
+  virtual void deleteFcgEdgeInfo(KvCFcgEdgeInfo* info);
+  virtual void synchronizeEdgeInfoAtConstruction(KvCFcgEdgeInfo* info, KvCCallOperation* call);
+
+  // Registers both functions and adds one call to their edge; true when the edge is new.
+  bool addEdge(KvCFcgFunctionInfo* calling, KvCFcgFunctionInfo* called, leda::edge& edge);
+  void registerNode(KvCFcgFunctionInfo* function);
+  // Deletes every edge (restoring hidden ones first) and its info.
+  void deleteAllEdges();
+  // Passes every node's info to deleteFcgNodeInfo; nodes and map stay.
+  void deleteAllNodes();
+  // Deletes one edge and its info.
+  void deleteEdge(leda::edge e);
+
+  leda::map<KvCFcgFunctionInfo*, leda::node>& nodeMap() { return nodes; }
+  bool isIncomplete() const { return incomplete; }
+  // Forgets every node (for a derived graph's shutdown, together with clear()).
+  void clearNodeMap();
+
+private:
+  friend class KvCFcnSmbVisitor;
+
+  struct PairHash {
+    std::size_t operator()(const std::pair<leda::node, leda::node>& p) const noexcept;
+  };
+
+  void treatFcnSymbolByUses(KvCParamSymbol* function);
+  bool isEnteredOutsideFunctions(KvCCallOperation* call) const;
+  void forall_CallingFunctionsOf(leda::node v, KvCFcgFunctor& functor);
+  void forall_CalledFunctionsOf(leda::node v, KvCFcgFunctor& functor);
+
+  leda::map<KvCFcgFunctionInfo*, leda::node> nodes;
+  bool incomplete = true;
+  std::unordered_map<std::pair<leda::node, leda::node>, leda::edge, PairHash> edgeIndex;
+};
+
+#endif
