@@ -82,7 +82,9 @@ private:
       else
         db->addQsoUse(loc);
     }
-    if (!symbol->isSelected())
+    // The sets collect the declared or defined object (operand 0), not the formal
+    // parameters listed after it.
+    if (!symbol->isSelected() || loc->getIndexInParent() != 0)
       return;
     KV_OpOperator* kind = pParentOperation->getOperator();
     if (kind->isFunctionDeclaration())

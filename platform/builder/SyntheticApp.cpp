@@ -84,7 +84,7 @@ private:
     int32 = types[1];
     variables.reserve(static_cast<std::size_t>(shape.variables));
     for (int v = 0; v < shape.variables; ++v) {
-      const std::string name = "v" + std::to_string(v);
+      const std::string name = std::string("v").append(std::to_string(v));
       // Mostly Int16; every fourth Int32, every seventh UInt8.
       KV_DataType* type = v % 7 == 6 ? types[2] : (v % 4 == 3 ? types[1] : types[0]);
       variables.push_back(app.variable(name.c_str(), type));
@@ -96,8 +96,8 @@ private:
     functions.reserve(static_cast<std::size_t>(shape.functions));
     for (int i = 0; i < shape.functions; ++i) {
       if (i % kFunctionsPerFile == 0)
-        app.file(("syn" + std::to_string(i / kFunctionsPerFile) + ".c").c_str());
-      functions.push_back(&app.function(("f" + std::to_string(i)).c_str()));
+        app.file(std::string("syn").append(std::to_string(i / kFunctionsPerFile)).append(".c").c_str());
+      functions.push_back(&app.function(std::string("f").append(std::to_string(i)).c_str()));
     }
   }
 

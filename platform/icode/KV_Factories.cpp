@@ -32,7 +32,7 @@ KV_SymbolDB* KV_ICodeFactoryContainer::getSymbolDB() const { return codeViewData
 // --- locations and what they hold
 
 KV_ExprLocation* KV_ExprLocationFactory::createEmpty() {
-  return codeViewData->adopt(std::make_unique<KV_ExprLocation>(codeViewData->nextSerial()));
+  return codeViewData->make<KV_ExprLocation>();
 }
 
 KV_ExprLocation* KV_ExprLocationFactory::createFromExpression(KvCIcExpression* expr) {
@@ -84,18 +84,16 @@ KV_Constant* KV_ExprLocationFactory::createConstant(tagKvEConstantType type, std
                                                     KV_DataType* dt) {
   if (type == KV_CONST_DOUBLE)
     return createDoubleConstant(static_cast<double>(value), dt);
-  return codeViewData->adopt(
-      std::make_unique<KV_Constant>(codeViewData->nextSerial(), type, value, dt));
+  return codeViewData->make<KV_Constant>(type, value, dt);
 }
 
 KV_Constant* KV_ExprLocationFactory::createDoubleConstant(double value, KV_DataType* dt) {
-  return codeViewData->adopt(std::make_unique<KV_Constant>(codeViewData->nextSerial(), value, dt));
+  return codeViewData->make<KV_Constant>(value, dt);
 }
 
 KvCStringExpr* KV_ExprLocationFactory::createString(const WmCXString& text, bool asCode,
                                                     bool quoted) {
-  return codeViewData->adopt(
-      std::make_unique<KvCStringExpr>(codeViewData->nextSerial(), text, asCode, quoted));
+  return codeViewData->make<KvCStringExpr>(text, asCode, quoted);
 }
 
 KvCSmbInitValExpr* KV_ExprLocationFactory::createInitValue(const std::vector<int>& sizes) {
@@ -104,8 +102,7 @@ KvCSmbInitValExpr* KV_ExprLocationFactory::createInitValue(const std::vector<int
   for (int size : sizes)
     if (size < 1)
       return nullptr;
-  return codeViewData->adopt(
-      std::make_unique<KvCSmbInitValExpr>(codeViewData->nextSerial(), sizes));
+  return codeViewData->make<KvCSmbInitValExpr>(sizes);
 }
 
 // --- operations
@@ -130,10 +127,9 @@ KV_OperationFactory::createOperation(tagKvEOperatorKind kind,
   if (!oper || oper->isQualifiedSymbol() || oper->isCodeBlock() ||
       (oper->getArity() >= 0 && oper->getArity() != static_cast<int>(operands.size())))
     return nullptr;
-  auto op = std::make_unique<KV_Operation>(codeViewData->nextSerial(), oper);
-  if (!attachAll(op.get(), operands))
-    return nullptr;
-  return codeViewData->adopt(std::move(op));
+  // A refused operation stays behind, held by nothing and owned by the code view data.
+  KV_Operation* op = codeViewData->make<KV_Operation>(oper);
+  return attachAll(op, operands) ? op : nullptr;
 }
 
 KV_Operation* KV_OperationFactory::createCast(KV_DataType* target, KV_ExprLocation* operand) {
@@ -150,21 +146,20 @@ KV_OperationFactory::createCallOperation(KvCParamSymbol* called,
                                          std::initializer_list<KV_ExprLocation*> parameters) {
   if (!called)
     return nullptr;
-  auto call = std::make_unique<KvCCallOperation>(codeViewData->nextSerial(), called);
+  KvCCallOperation* call = codeViewData->make<KvCCallOperation>(called);
   KV_ExprLocation* access =
       codeViewData->getFactoryContainer()->getExprLocFactory()->createFromSymbol(called);
-  if (!call->appendOperand(access) || !attachAll(call.get(), parameters)) {
+  if (!call->appendOperand(access) || !attachAll(call, parameters)) {
     call->setOperand(0, nullptr);
     return nullptr;
   }
   call->setDataType(called->getDataType());
-  return codeViewData->adopt(std::move(call));
+  return call;
 }
 
 KvCCodeBlockOperation* KV_OperationFactory::createCodeBlock(const WmCXString& code,
                                                             bool assembler) {
-  return codeViewData->adopt(
-      std::make_unique<KvCCodeBlockOperation>(codeViewData->nextSerial(), code, assembler));
+  return codeViewData->make<KvCCodeBlockOperation>(code, assembler);
 }
 
 // --- symbol accesses
@@ -172,8 +167,7 @@ KvCCodeBlockOperation* KV_OperationFactory::createCodeBlock(const WmCXString& co
 KV_QualifiedSymbolOp* KV_QSOFactory::createQso(KvCSymbol* symbol) {
   if (!symbol)
     return nullptr;
-  return codeViewData->adopt(
-      std::make_unique<KV_QualifiedSymbolOp>(codeViewData->nextSerial(), symbol));
+  return codeViewData->make<KV_QualifiedSymbolOp>(symbol);
 }
 
 KV_QualifiedSymbolOp* KV_QSOFactory::createComponentQso(KvCSymbol* base, KvCSymbol* component) {
@@ -188,15 +182,13 @@ KV_QualifiedSymbolOp* KV_QSOFactory::createComponentQso(KvCSymbol* base, KvCSymb
 KV_Statement* KV_StatementFactory::createStatement(KV_ExprLocation* root) {
   if (root && root->getParent())
     return nullptr;
-  KV_Statement* statement =
-      codeViewData->adopt(std::make_unique<KV_Statement>(codeViewData->nextSerial()));
+  KV_Statement* statement = codeViewData->make<KV_Statement>();
   statement->setExprLoc(root);
   return statement;
 }
 
 KvCCStmTable* KV_StatementFactory::createCStmTable(KvCParamSymbol* codeBlock, KvCIcFileId* file) {
-  KvCCStmTable* table =
-      codeViewData->adopt(std::make_unique<KvCCStmTable>(codeViewData->nextSerial()));
+  KvCCStmTable* table = codeViewData->make<KvCCStmTable>();
   table->setCodeBlockSymbol(codeBlock);
   table->setFile(file);
   return table;

@@ -5,9 +5,9 @@
 KV_Operation::~KV_Operation() = default;
 
 KV_ExprLocation* KV_Operation::getOperand(int i) const {
-  if (i < 0 || i >= getNumberOfOperands())
+  if (i < 0 || i >= operandCount)
     return nullptr;
-  return operands[static_cast<std::size_t>(i)];
+  return const_cast<KV_Operation*>(this)->slot(i);
 }
 
 KV_Operation* KV_Operation::getParentOperation() const {
@@ -23,16 +23,18 @@ KV_Statement* KV_Operation::findParentStatement() const {
 bool KV_Operation::setOperand(int i, KV_ExprLocation* loc) {
   if (i < 0 || i > getNumberOfOperands())
     return false;
-  const auto slot = static_cast<std::size_t>(i);
-  if (slot < operands.size() && operands[slot] == loc)
+  if (i < operandCount && slot(i) == loc)
     return true;
   if (loc && (loc->getParent() || isWithin(loc)))
     return false;
-  if (slot == operands.size())
-    operands.push_back(nullptr);
-  if (KV_ExprLocation* old = operands[slot])
+  if (i == operandCount) {
+    if (operandCount >= kInlineOperands)
+      extraOperands.push_back(nullptr);
+    ++operandCount;
+  }
+  if (KV_ExprLocation* old = slot(i))
     old->detach();
-  operands[slot] = loc;
+  slot(i) = loc;
   if (loc)
     loc->attach(this, i);
   return true;

@@ -28,7 +28,7 @@ public:
   virtual KvCCodeBlockOperation* asCodeBlockOperation() { return nullptr; }
 
   KV_OpOperator* getOperator() const { return oper; }
-  int getNumberOfOperands() const { return static_cast<int>(operands.size()); }
+  int getNumberOfOperands() const { return operandCount; }
   // The location of operand i, or null for an empty slot or a position out of range.
   KV_ExprLocation* getOperand(int i) const;
   // The operation of which the holding location is an operand, or null.
@@ -56,8 +56,18 @@ public:
   bool appendOperand(KV_ExprLocation* loc) { return setOperand(getNumberOfOperands(), loc); }
 
 private:
+  // The first operands are kept inline (most operations have at most three), the rest
+  // in a vector.
+  static constexpr int kInlineOperands = 3;
+  KV_ExprLocation*& slot(int i) {
+    return i < kInlineOperands ? inlineOperands[i]
+                               : extraOperands[static_cast<std::size_t>(i - kInlineOperands)];
+  }
+
   KV_OpOperator* oper;
-  std::vector<KV_ExprLocation*> operands;
+  int operandCount = 0;
+  KV_ExprLocation* inlineOperands[kInlineOperands] = {};
+  std::vector<KV_ExprLocation*> extraOperands;
   KV_DataType* dataType = nullptr;
   KV_Scaling* scaling = nullptr;
   KV_OpConversionLevel* conversionLevel = nullptr;

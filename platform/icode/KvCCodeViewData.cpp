@@ -47,6 +47,28 @@ KvCCodeViewData::KvCCodeViewData(const WmCXString& applicationName)
 KvCCodeViewData::~KvCCodeViewData() {
   std::vector<KvCCodeViewData*>& live = liveCodeViewData();
   live.erase(std::remove(live.begin(), live.end(), this), live.end());
+  // Owners of databases first (they reset their locations' records), then the elements.
+  factories.reset();
+  dbServer.reset();
+  symbolDB.reset();
+  fileServer.reset();
+  typeServer.reset();
+  for (auto it = elements.rbegin(); it != elements.rend(); ++it)
+    (*it)->~KV_ICodeElem();
+  elements.clear();
+}
+
+void* KvCCodeViewData::allocate(std::size_t size, std::size_t alignment) {
+  constexpr std::size_t kBlockSize = std::size_t{1} << 20;
+  std::size_t start = (blockUsed + alignment - 1) / alignment * alignment;
+  if (blocks.empty() || start + size > blockSize) {
+    blockSize = size > kBlockSize ? size : kBlockSize;
+    // operator new[] of unsigned char gives storage aligned for any fundamental type.
+    blocks.push_back(std::make_unique<unsigned char[]>(blockSize));
+    start = 0;
+  }
+  blockUsed = start + size;
+  return blocks.back().get() + start;
 }
 
 KV_OpConversionLevel* KvCCodeViewData::getConversionLevel(tagKvEConversionLevel level) const {
@@ -80,10 +102,6 @@ KvCRtosProtection* KvCCodeViewData::createRtosProtection(const WmCXString& resou
 KvCNameSpace* KvCCodeViewData::createNameSpace() {
   nameSpaces.push_back(std::make_unique<KvCNameSpace>());
   return nameSpaces.back().get();
-}
-
-void KvCCodeViewData::adoptElement(std::unique_ptr<KV_ICodeElem> elem) {
-  elements.push_back(std::move(elem));
 }
 
 KvCExprLocDB* KvCExprLocDBServer::demandExprLocDB(KV_DataType* type) {

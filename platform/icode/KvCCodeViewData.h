@@ -12,7 +12,10 @@
 #include "platform/support/HulPlatformExport.h"
 #include "platform/support/WmCXString.h"
 
+#include <cstddef>
 #include <memory>
+#include <new>
+#include <utility>
 #include <vector>
 
 class KV_DataTypeServer;
@@ -60,21 +63,28 @@ public:
   KvCRtosProtection* createRtosProtection(const WmCXString& resourceName);
   KvCNameSpace* createNameSpace();
 
-  // The serial number the next element gets, and taking ownership of a new element.
-  int nextSerial() const { return static_cast<int>(elements.size()); }
-  template <class T> T* adopt(std::unique_ptr<T> elem) {
-    T* result = elem.get();
-    adoptElement(std::move(elem));
-    return result;
+  // Makes a new element of type T, numbered with the next serial number (its first
+  // constructor argument) and owned here. Elements live in large blocks in creation
+  // order, so that walks over the ICode touch memory mostly in sequence.
+  template <class T, class... A> T* make(A&&... args) {
+    void* place = allocate(sizeof(T), alignof(T));
+    T* elem = ::new (place) T(nextSerial(), std::forward<A>(args)...);
+    elements.push_back(elem);
+    return elem;
   }
+  int nextSerial() const { return static_cast<int>(elements.size()); }
   int getNumberOfElements() const { return static_cast<int>(elements.size()); }
 
 private:
-  void adoptElement(std::unique_ptr<KV_ICodeElem> elem);
+  void* allocate(std::size_t size, std::size_t alignment);
 
-  // Elements are destroyed last: the databases of symbols, types and files reset the
-  // records of their locations when they go.
-  std::vector<std::unique_ptr<KV_ICodeElem>> elements;
+  // Blocks of element storage and the elements in creation order. The elements are
+  // destroyed after the symbols, types and files: their databases reset the records of
+  // their locations when they go.
+  std::vector<std::unique_ptr<unsigned char[]>> blocks;
+  std::size_t blockUsed = 0;
+  std::size_t blockSize = 0;
+  std::vector<KV_ICodeElem*> elements;
   std::unique_ptr<KvCIcApplication> application;
   std::vector<std::unique_ptr<KvCIcSubApplication>> subApplications;
   std::vector<std::unique_ptr<KvCIcCodeUnit>> codeUnits;

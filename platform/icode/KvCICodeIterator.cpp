@@ -75,14 +75,45 @@ bool visitOperationNode(KV_Operation* op, KV_ICodeElemVisitor* visitor) {
   return true;
 }
 
+// Expression trees are made bottom-up, operands before operations before statements,
+// and the code view data keeps elements in creation order: the tree of a statement lies
+// in memory just before the statement. When a statement is visited, the memory before
+// the next element waiting on the stack is loaded ahead, a few lines at each element
+// visited, so that walks over ICode far larger than the caches stream instead of waiting
+// on each element.
+class LookAhead {
+public:
+  void aimBefore(const KV_ICodeElem* next) {
+    const char* end = reinterpret_cast<const char*>(next);
+    const char* begin = end - kAhead;
+    cursor = cursor > begin && cursor < end ? cursor : begin;
+    limit = end;
+  }
+  void step() {
+    for (int i = 0; i < kLinesPerStep && cursor < limit; ++i, cursor += kLine)
+      __builtin_prefetch(cursor);
+  }
+
+private:
+  static constexpr std::ptrdiff_t kAhead = 8192;
+  static constexpr std::ptrdiff_t kLine = 64;
+  static constexpr int kLinesPerStep = 3;
+  const char* cursor = nullptr;
+  const char* limit = nullptr;
+};
+
 } // namespace
 
 bool KvCICodeIterator::walk(KV_ICodeElem* start, KV_ICodeElemVisitor* visitor) {
   // Local, so that a visitor may start another walk with this iterator.
   std::vector<KV_ICodeElem*> stack{start};
+  LookAhead lookAhead;
   while (!stack.empty()) {
     KV_ICodeElem* elem = stack.back();
     stack.pop_back();
+    if (elem->asStatement() && !stack.empty())
+      lookAhead.aimBefore(stack.back());
+    lookAhead.step();
     if (visitor->stopIteration())
       return true;
     if (KV_ExprLocation* loc = elem->asExprLocation()) {

@@ -6,6 +6,8 @@
 
 #include "platform/icode/KvCSymbol.h"
 
+#include <memory>
+
 class KvCCStmTable;
 class KvCFcgFunctionInfo;
 

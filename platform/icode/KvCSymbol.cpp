@@ -6,8 +6,7 @@
 #include "platform/icode/KvCParamSymbol.h"
 
 KvCSymbol::KvCSymbol(int index, WmCXString symbolName, KV_DataType* type)
-    : name(std::move(symbolName)), debugIndex(index), dataType(type),
-      db(std::make_unique<KvCExprLocDB>()) {}
+    : name(std::move(symbolName)), debugIndex(index), dataType(type) {}
 
 KvCSymbol::~KvCSymbol() = default;
 

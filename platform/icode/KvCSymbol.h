@@ -10,14 +10,12 @@
 #ifndef HUL_PLATFORM_ICODE_KVCSYMBOL_H
 #define HUL_PLATFORM_ICODE_KVCSYMBOL_H
 
+#include "platform/icode/KvCExprLocDB.h"
 #include "platform/support/HulPlatformExport.h"
 #include "platform/support/WmCXString.h"
 
-#include <memory>
-
 class KV_DataType;
 class KV_Scaling;
-class KvCExprLocDB;
 class KvCParamSymbol;
 class KvCUnparamSymbol;
 
@@ -56,7 +54,7 @@ public:
   virtual KvCParamSymbol* asParamSymbol() { return nullptr; }
   virtual KvCUnparamSymbol* asUnparamSymbol() { return nullptr; }
 
-  KvCExprLocDB* getExprLocDB() const { return db.get(); }
+  KvCExprLocDB* getExprLocDB() const { return &db; }
   bool isSelected() const { return selected; }
   void setSelected(bool value) { selected = value; }
 
@@ -81,7 +79,8 @@ private:
   int debugIndex;
   KV_DataType* dataType;
   KV_Scaling* scaling = nullptr;
-  std::unique_ptr<KvCExprLocDB> db;
+  // Kept inline: the database is reached for every use of the symbol.
+  mutable KvCExprLocDB db;
   unsigned roles = 0;
   bool selected = true;
 };
