@@ -39,8 +39,7 @@ protected:
   }
   // A location holding an access whose symbol is missing.
   KV_ExprLocation* accessWithoutSymbol() {
-    KV_QualifiedSymbolOp* qso =
-        app.data().adopt(std::make_unique<KV_QualifiedSymbolOp>(app.data().nextSerial(), nullptr));
+    KV_QualifiedSymbolOp* qso = app.data().make<KV_QualifiedSymbolOp>(nullptr);
     return app.factories().getExprLocFactory()->createFromExpression(qso);
   }
 

@@ -15,8 +15,7 @@ class OperationQueryTest : public ::testing::Test {
 protected:
   // An operation of `kind` without operands (the decision does not look at them).
   KV_Operation* operationOf(tagKvEOperatorKind kind) {
-    return app.data().adopt(
-        std::make_unique<KV_Operation>(app.data().nextSerial(), KV_OpOperator::get(kind)));
+    return app.data().make<KV_Operation>(KV_OpOperator::get(kind));
   }
   static bool canExpand(KV_Operation* op) {
     return KvCOperationQuery::canOperationExpandToNotSideEffectFreeParamSymbol(op);
