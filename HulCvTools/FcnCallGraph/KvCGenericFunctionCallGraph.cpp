@@ -4,9 +4,8 @@
 #include "HulCvTools/FcnCallGraph/KvCFcgQuery.h"
 #include "HulCvTools/FcnCallGraph/KvCFcnSmbVisitor.h"
 #include "HulCvTools/ModelInterfaces/ICodeModel.h"
-#include "platform/leda/dictionary.h"
 
-#include <functional>
+#include <cstdint>
 
 // The graph type every call graph of the library derives from, instantiated and exported
 // here once.
@@ -31,14 +30,100 @@ void KvCFcnSmbVisitor::visitParamSmbDBObj(KV_ParamSmbDBObj* entry) {
 
 void KvCFcnSmbVisitor::visitUnparamSymbol(KvCUnparamSymbol* /*symbol*/) {}
 
-std::size_t KvCGenericFunctionCallGraph::PairHash::operator()(
-    const std::pair<leda::node, leda::node>& p) const noexcept {
-  const std::size_t a = std::hash<const void*>()(p.first);
-  const std::size_t b = std::hash<const void*>()(p.second);
-  return a ^ (b + 0x9e3779b97f4a7c15ULL + (a << 6) + (a >> 2));
-}
+// The index from (calling node, called node) to the pair's edges: open addressing with
+// linear probing over a flat table, deletion by backward shift. A pair may appear more
+// than once (see the class comment). Expected O(1) per operation.
+class KvCFcgEdgeIndex {
+public:
+  explicit KvCFcgEdgeIndex(const KvCFcgGraph& g) : graph(g) {}
 
-KvCGenericFunctionCallGraph::KvCGenericFunctionCallGraph() = default;
+  void insert(leda::node v, leda::node w, leda::edge e) {
+    if ((count + 1) * 4 > slots.size() * 3)
+      grow();
+    std::size_t i = home(v, w);
+    while (slots[i].e)
+      i = next(i);
+    slots[i] = Slot{v, w, e};
+    ++count;
+  }
+
+  // The first visible edge of the pair in creation order, or null.
+  leda::edge find(leda::node v, leda::node w) const {
+    if (slots.empty())
+      return nullptr;
+    leda::edge best = nullptr;
+    for (std::size_t i = home(v, w); slots[i].e; i = next(i)) {
+      const Slot& s = slots[i];
+      if (s.v != v || s.w != w || graph.is_hidden(s.e))
+        continue;
+      if (!best || graph.index(s.e) < graph.index(best))
+        best = s.e;
+    }
+    return best;
+  }
+
+  void erase(leda::node v, leda::node w, leda::edge e) {
+    if (slots.empty())
+      return;
+    std::size_t i = home(v, w);
+    while (slots[i].e && slots[i].e != e)
+      i = next(i);
+    if (!slots[i].e)
+      return;
+    // Backward shift: move later entries of the probe run into the gap when their home
+    // lies at or before it.
+    std::size_t gap = i;
+    for (std::size_t j = next(gap); slots[j].e; j = next(j)) {
+      const std::size_t h = home(slots[j].v, slots[j].w);
+      const bool movable = gap <= j ? (h <= gap || h > j) : (h <= gap && h > j);
+      if (movable) {
+        slots[gap] = slots[j];
+        gap = j;
+      }
+    }
+    slots[gap] = Slot{};
+    --count;
+  }
+
+  void clear() {
+    slots.assign(slots.size(), Slot{});
+    count = 0;
+  }
+
+private:
+  struct Slot {
+    leda::node v = nullptr;
+    leda::node w = nullptr;
+    leda::edge e = nullptr;
+  };
+
+  std::size_t home(leda::node v, leda::node w) const {
+    const auto a = reinterpret_cast<std::uintptr_t>(v);
+    const auto b = reinterpret_cast<std::uintptr_t>(w);
+    std::uint64_t h = (a * 0x9e3779b97f4a7c15ULL) ^ (b + 0x632be59bd9b4e019ULL + (a >> 7));
+    h ^= h >> 29;
+    h *= 0xbf58476d1ce4e5b9ULL;
+    h ^= h >> 32;
+    return static_cast<std::size_t>(h) & (slots.size() - 1);
+  }
+  std::size_t next(std::size_t i) const { return (i + 1) & (slots.size() - 1); }
+
+  void grow() {
+    std::vector<Slot> old = std::move(slots);
+    slots.assign(old.empty() ? 64 : old.size() * 2, Slot{});
+    count = 0;
+    for (const Slot& s : old)
+      if (s.e)
+        insert(s.v, s.w, s.e);
+  }
+
+  const KvCFcgGraph& graph;
+  std::vector<Slot> slots;
+  std::size_t count = 0;
+};
+
+KvCGenericFunctionCallGraph::KvCGenericFunctionCallGraph()
+    : edgeIndex(std::make_unique<KvCFcgEdgeIndex>(*this)) {}
 
 KvCGenericFunctionCallGraph::~KvCGenericFunctionCallGraph() { deleteAllEdges(); }
 
@@ -60,15 +145,15 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
 }
 
 void KvCGenericFunctionCallGraph::treatFcnSymbolByUses(KvCParamSymbol* function) {
-  leda::dictionary<int, KV_ExprLocation*> uses;
-  function->getExprLocDB()->listUses(uses);
+  // The uses in ascending key (serial) order.
+  function->getExprLocDB()->listUses(useBuffer);
   KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
   if (!info)
     return;
   registerNode(info);
   synchronizeNodeInfoAtConstruction(info, function);
-  for (const auto& use : uses) {
-    KV_Operation* op = use.second->getOperation();
+  for (KV_ExprLocation* use : useBuffer) {
+    KV_Operation* op = use->getOperation();
     if (!op) {
       incomplete = true;
       continue;
@@ -145,27 +230,32 @@ bool KvCGenericFunctionCallGraph::delCall(KvCCallOperation* call) {
 
 bool KvCGenericFunctionCallGraph::addEdge(KvCFcgFunctionInfo* calling, KvCFcgFunctionInfo* called,
                                           leda::edge& e) {
-  registerNode(calling);
-  registerNode(called);
-  if (getEdge(calling, called, e)) {
+  const leda::node v = nodeOf(calling);
+  const leda::node w = nodeOf(called);
+  if (leda::edge existing = edgeIndex->find(v, w)) {
+    e = existing;
     if (KvCFcgEdgeInfo* info = inf(e))
       info->incCardinality();
     return false;
   }
-  const leda::node v = nodes[calling];
-  const leda::node w = nodes[called];
   KvCFcgEdgeInfo* info = createFcgEdgeInfo();
   e = new_edge(v, w, info);
-  edgeIndex[{v, w}] = e;
+  edgeIndex->insert(v, w, e);
   if (info)
     info->incCardinality();
   return true;
 }
 
+leda::node KvCGenericFunctionCallGraph::nodeOf(KvCFcgFunctionInfo* function) {
+  leda::node& v = nodes[function];
+  if (!v)
+    v = new_node(function);
+  return v;
+}
+
 void KvCGenericFunctionCallGraph::registerNode(KvCFcgFunctionInfo* function) {
-  if (!function || nodes.defined(function))
-    return;
-  nodes[function] = new_node(function);
+  if (function)
+    nodeOf(function);
 }
 
 // --- lookups
@@ -183,10 +273,10 @@ bool KvCGenericFunctionCallGraph::getEdge(KvCFcgFunctionInfo* calling, KvCFcgFun
   leda::node w = nullptr;
   if (!getNode(calling, v) || !getNode(called, w))
     return false;
-  auto it = edgeIndex.find({v, w});
-  if (it == edgeIndex.end() || is_hidden(it->second))
+  leda::edge found = edgeIndex->find(v, w);
+  if (!found)
     return false;
-  e = it->second;
+  e = found;
   return true;
 }
 
@@ -203,7 +293,7 @@ int KvCGenericFunctionCallGraph::getNrOfCalled(KvCFcgFunctionInfo* function) con
 // --- removal
 
 void KvCGenericFunctionCallGraph::deleteEdge(leda::edge e) {
-  edgeIndex.erase({source(e), target(e)});
+  edgeIndex->erase(source(e), target(e), e);
   deleteFcgEdgeInfo(inf(e));
   del_edge(e);
 }
@@ -231,9 +321,11 @@ void KvCGenericFunctionCallGraph::removeCalledEdges(KvCFcgFunctionInfo* function
 
 void KvCGenericFunctionCallGraph::deleteAllEdges() {
   restore_all_edges();
-  for (leda::edge e : all_edges())
-    deleteEdge(e);
-  edgeIndex.clear();
+  for (leda::edge e : all_edges()) {
+    deleteFcgEdgeInfo(inf(e));
+    del_edge(e);
+  }
+  edgeIndex->clear();
 }
 
 void KvCGenericFunctionCallGraph::deleteAllNodes() {

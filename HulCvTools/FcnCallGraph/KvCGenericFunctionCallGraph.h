@@ -11,9 +11,10 @@
 // deleted: a copied node map would point into the source graph.
 //
 // Lookups are O(1): next to the node map the graph keeps an index from (calling node,
-// called node) to the pair's edge, so a scheduler calling N functions is entered in O(N).
-// An edge that is hidden counts as absent for getEdge, as a scan of visible out-edges
-// would find it.
+// called node) to the pair's edges, so a scheduler calling N functions is entered in
+// O(N). getEdge answers what a scan of the caller's visible out-edges would: the first
+// visible edge to the called node in creation order (a pair has two edges only when a
+// call was added while the pair's edge was hidden).
 //
 // The virtual hooks let derived graphs (recursion analysis, reuse graph) change what the
 // nodes and edges carry.
@@ -30,11 +31,11 @@
 #include "platform/leda/map.h"
 #include "platform/leda/set.h"
 
-#include <cstddef>
-#include <unordered_map>
-#include <utility>
+#include <memory>
+#include <vector>
 
 class KvCFcnSmbVisitor;
+class KvCFcgEdgeIndex;
 
 // The graph of every call graph: instantiated (and exported) once, by the library.
 extern template class HULCV_API leda::GRAPH<KvCFcgFunctionInfo*, KvCFcgEdgeInfo*>;
@@ -114,18 +115,18 @@ protected:
 private:
   friend class KvCFcnSmbVisitor;
 
-  struct PairHash {
-    std::size_t operator()(const std::pair<leda::node, leda::node>& p) const noexcept;
-  };
-
   void treatFcnSymbolByUses(KvCParamSymbol* function);
+  // The function's node, registered when missing (one map lookup).
+  leda::node nodeOf(KvCFcgFunctionInfo* function);
   bool isEnteredOutsideFunctions(KvCCallOperation* call) const;
   void forall_CallingFunctionsOf(leda::node v, KvCFcgFunctor& functor);
   void forall_CalledFunctionsOf(leda::node v, KvCFcgFunctor& functor);
 
   leda::map<KvCFcgFunctionInfo*, leda::node> nodes;
   bool incomplete = true;
-  std::unordered_map<std::pair<leda::node, leda::node>, leda::edge, PairHash> edgeIndex;
+  std::unique_ptr<KvCFcgEdgeIndex> edgeIndex;
+  // Reused by construction for the uses of one symbol at a time.
+  std::vector<KV_ExprLocation*> useBuffer;
 };
 
 #endif

@@ -6,6 +6,8 @@
 #include "platform/icode/KvCCStmTable.h"
 #include "platform/icode/KvCParamSymbol.h"
 
+#include <algorithm>
+
 KvCExprLocDB::KvCExprLocDB() : qsoPart(this) {}
 
 KvCExprLocDB::~KvCExprLocDB() { clear(); }
@@ -58,6 +60,15 @@ void KvCExprLocDB::listDefs(leda::dictionary<int, KV_ExprLocation*>& defs) const
 
 void KvCExprLocDB::listUses(leda::dictionary<int, KV_ExprLocation*>& uses) const {
   listRange(KV_DB_USE, KV_DB_QSO_USE, uses);
+}
+
+void KvCExprLocDB::listUses(std::vector<KV_ExprLocation*>& uses) const {
+  uses.clear();
+  for (int c = KV_DB_USE; c <= KV_DB_QSO_USE; ++c)
+    uses.insert(uses.end(), entries[c].begin(), entries[c].end());
+  std::sort(uses.begin(), uses.end(), [](const KV_ExprLocation* a, const KV_ExprLocation* b) {
+    return a->getSerial() < b->getSerial();
+  });
 }
 
 void KvCExprLocDB::listCategory(tagKvEExprLocDBCategory category,

@@ -58,6 +58,8 @@ public:
   // cleared first.
   void listDefs(leda::dictionary<int, KV_ExprLocation*>& defs) const;
   void listUses(leda::dictionary<int, KV_ExprLocation*>& uses) const;
+  // The uses in ascending serial order, into a vector the caller may reuse (cleared first).
+  void listUses(std::vector<KV_ExprLocation*>& uses) const;
   void listCategory(tagKvEExprLocDBCategory category,
                     leda::dictionary<int, KV_ExprLocation*>& entries) const;
 

@@ -14,6 +14,13 @@ class KvCCallOperation;
 class KvCIcFileId;
 class KvCParamSymbol;
 
+// An element of a function's set of called functions: the function and its debug index,
+// kept together so that the set is ordered without reading the symbols.
+struct KvCFcgCalledFunction {
+  int debugIndex;
+  KvCParamSymbol* symbol;
+};
+
 class HUL_PLATFORM_API KvCFcgFunctionInfo {
 public:
   explicit KvCFcgFunctionInfo(KvCParamSymbol* owner);
@@ -21,7 +28,7 @@ public:
   KvCParamSymbol* getSymbol() const { return symbol; }
 
   leda::set<KvCCallOperation*>& getCallOperationsSet() { return callOperations; }
-  leda::set<KvCParamSymbol*>& getCalledFunctionsSet() { return calledFunctions; }
+  leda::set<KvCFcgCalledFunction>& getCalledFunctionsSet() { return calledFunctions; }
   // Each answers whether the set changed.
   bool addCallOperation(KvCCallOperation* call) { return call && callOperations.insert(call); }
   bool delCallOperation(KvCCallOperation* call) { return call && callOperations.del(call); }
@@ -43,7 +50,7 @@ public:
 private:
   KvCParamSymbol* symbol;
   leda::set<KvCCallOperation*> callOperations;
-  leda::set<KvCParamSymbol*> calledFunctions;
+  leda::set<KvCFcgCalledFunction> calledFunctions;
   bool inLoop = false;
   bool inlined = false;
   bool removed = false;

@@ -31,10 +31,8 @@ int compareCallsBySerial(KvCCallOperation* const& a, KvCCallOperation* const& b)
   return x < y ? -1 : (x > y ? 1 : 0);
 }
 
-int compareFunctionsByDebugIndex(KvCParamSymbol* const& a, KvCParamSymbol* const& b) {
-  const int x = a ? a->getDebugIndex() : -1;
-  const int y = b ? b->getDebugIndex() : -1;
-  return x < y ? -1 : (x > y ? 1 : 0);
+int compareFunctionsByDebugIndex(const KvCFcgCalledFunction& a, const KvCFcgCalledFunction& b) {
+  return a.debugIndex < b.debugIndex ? -1 : (a.debugIndex > b.debugIndex ? 1 : 0);
 }
 } // namespace
 
@@ -43,5 +41,8 @@ KvCFcgFunctionInfo::KvCFcgFunctionInfo(KvCParamSymbol* owner)
       calledFunctions(&compareFunctionsByDebugIndex) {}
 
 bool KvCFcgFunctionInfo::addCalledFcn(KvCFcgFunctionInfo* called) {
-  return called && called->symbol && calledFunctions.insert(called->symbol);
+  if (!called || !called->symbol)
+    return false;
+  return calledFunctions.insert(
+      KvCFcgCalledFunction{called->symbol->getDebugIndex(), called->symbol});
 }

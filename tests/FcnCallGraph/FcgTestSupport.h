@@ -68,8 +68,10 @@ inline std::set<KvCCallOperation*> callsOf(KvCParamSymbol* fn) {
 }
 
 inline std::set<KvCParamSymbol*> calledOf(KvCParamSymbol* fn) {
-  const auto& called = infoOf(fn)->getCalledFunctionsSet();
-  return {called.begin(), called.end()};
+  std::set<KvCParamSymbol*> result;
+  for (const KvCFcgCalledFunction& called : infoOf(fn)->getCalledFunctionsSet())
+    result.insert(called.symbol);
+  return result;
 }
 
 class AppFixture : public ::testing::Test {
