@@ -10,10 +10,16 @@
 #include "platform/support/KvCOptionValueStorage.h"
 
 #include <iostream>
+#include <string>
 
 void printSectionTitle(std::ostream& out, const char* title) { out << "\n== " << title << " ==\n"; }
 
-int main() {
+// Usage: hulcv_demo [--dot FILE]
+int main(int argc, char** argv) {
+  const char* dotFile = nullptr;
+  for (int i = 1; i + 1 < argc; ++i)
+    if (std::string(argv[i]) == "--dot")
+      dotFile = argv[i + 1];
   std::ostream& out = std::cout;
   out << "HulCvTools demo\n";
 
@@ -30,12 +36,13 @@ int main() {
 
   {
     DemoSampleApp sample;
-    DemoRun run{out, storage, *control, sample};
+    DemoRun run{out, storage, *control, sample, dotFile};
     demoControl(run);
     out << "\nsample application: " << sample.app.data().getSymbolDB()->getNumberOfSymbols()
         << " symbols, " << sample.app.data().getNumberOfElements() << " ICode elements\n";
     demoElocQuery(run);
     demoExprLocDB(run);
+    demoCallGraph(run);
   }
 
   printSectionTitle(out, "Shutdown");

@@ -17,6 +17,8 @@ struct DemoRun {
   KvCOptionValueStorage& storage;
   KvCCvToolsControl& control;
   DemoSampleApp& sample;
+  // Where to write the call graph in Graphviz DOT, or null.
+  const char* dotFile = nullptr;
 };
 
 void printSectionTitle(std::ostream& out, const char* title);
@@ -27,5 +29,7 @@ void demoControl(DemoRun& run);
 void demoElocQuery(DemoRun& run);
 // Definitions and uses of a variable; a repeated expression.
 void demoExprLocDB(DemoRun& run);
+// The call graph, the functions on call cycles, inlining costs.
+void demoCallGraph(DemoRun& run);
 
 #endif
