@@ -1,12 +1,18 @@
 #include "platform/icode/KV_ExprLocation.h"
 
 #include "platform/icode/KV_Constant.h"
+#include "platform/icode/KV_DataType.h"
+#include "platform/icode/KV_Range.h"
 #include "platform/icode/KV_Operation.h"
 #include "platform/icode/KV_QualifiedSymbolOp.h"
 #include "platform/icode/KV_Statement.h"
 #include "platform/icode/KvCExprLocDB.h"
 #include "platform/icode/KvCSmbInitValExpr.h"
 #include "platform/icode/KvCStringExpr.h"
+
+#include <cfloat>
+
+KV_ExprLocation::KV_ExprLocation(int serialNumber) : KV_ICodeElem(serialNumber) {}
 
 KV_ExprLocation::~KV_ExprLocation() = default;
 
@@ -32,6 +38,35 @@ KvCSmbInitValExpr* KV_ExprLocation::getSmbInitValExpr() const {
 
 KV_DataType* KV_ExprLocation::getDataType() const {
   return expression ? expression->getDataType() : nullptr;
+}
+
+KV_Operation* KV_ExprLocation::getCalcOperation() const {
+  KV_Operation* op = getOperation();
+  if (!op || op->asQualifiedSymbolOp() || !op->getConversionInfo())
+    return nullptr;
+  return op;
+}
+
+void KV_ExprLocation::getValueRange(KV_Range& range) const {
+  if (valueRange) {
+    range = *valueRange;
+    return;
+  }
+  if (KV_Operation* calc = getCalcOperation()) {
+    range = calc->getResultRange();
+    return;
+  }
+  KV_DataType* type = getDataType();
+  KV_NumericalType* numerical = type ? type->asNumericalType() : nullptr;
+  if (numerical && !numerical->isFloat()) {
+    range = KV_Range::makeIntRange(numerical->getMinValue(), numerical->getMaxValue());
+    return;
+  }
+  range = KV_Range(-DBL_MAX, DBL_MAX);
+}
+
+void KV_ExprLocation::setValueRange(const KV_Range& range) {
+  valueRange = std::make_unique<KV_Range>(range);
 }
 
 KV_Operation* KV_ExprLocation::getParentOperation() const {

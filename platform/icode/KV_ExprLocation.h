@@ -15,7 +15,10 @@
 
 #include "platform/icode/KV_ICodeElem.h"
 
+#include <memory>
+
 class KV_Constant;
+class KV_Range;
 class KV_DataType;
 class KV_Scaling;
 class KvCExprLocDB;
@@ -25,7 +28,7 @@ class KvCStringExpr;
 
 class HUL_PLATFORM_API KV_ExprLocation : public KV_ICodeElem {
 public:
-  explicit KV_ExprLocation(int serialNumber) : KV_ICodeElem(serialNumber) {}
+  explicit KV_ExprLocation(int serialNumber);
   ~KV_ExprLocation() override;
 
   KV_ExprLocation* asExprLocation() override { return this; }
@@ -48,6 +51,15 @@ public:
   void setExprLocDataType(KV_DataType* type) { locationType = type; }
   KV_Scaling* getScaling() const { return scaling; }
   void setScaling(KV_Scaling* s) { scaling = s; }
+
+  // The held operation when it is a calculating operation (one with conversion data;
+  // not a symbol access), else null.
+  KV_Operation* getCalcOperation() const;
+  // Writes the location's value range in implemented units: the range recorded for the
+  // location, else a calculating operation's result range, else the limits of its
+  // integer type, else the whole double range.
+  void getValueRange(KV_Range& range) const;
+  void setValueRange(const KV_Range& range);
 
   // The enclosing operation or statement, or null.
   KV_ICodeElem* getParent() const { return parent; }
@@ -105,6 +117,7 @@ private:
   int indexInParent = -1;
   DbSlot defSlot;
   DbSlot useSlot;
+  std::unique_ptr<KV_Range> valueRange; // recorded range, made on first use
 };
 
 #endif

@@ -10,9 +10,12 @@
 #include "platform/icode/KV_OpOperator.h"
 #include "platform/icode/KvCIcExpression.h"
 
+#include <memory>
 #include <vector>
 
+class KV_OpConversionInfo;
 class KV_OpConversionLevel;
+class KV_Range;
 class KvCSrcRef;
 class KV_Scaling;
 class KvCCallOperation;
@@ -20,7 +23,7 @@ class KvCCodeBlockOperation;
 
 class HUL_PLATFORM_API KV_Operation : public KvCIcExpression {
 public:
-  KV_Operation(int serialNumber, KV_OpOperator* op) : KvCIcExpression(serialNumber), oper(op) {}
+  KV_Operation(int serialNumber, KV_OpOperator* op);
   ~KV_Operation() override;
 
   KV_Operation* asOperation() override { return this; }
@@ -45,6 +48,13 @@ public:
   void setScaling(KV_Scaling* s) { scaling = s; }
   KV_OpConversionLevel* getConversionLevel() const { return conversionLevel; }
   void setConversionLevel(KV_OpConversionLevel* level) { conversionLevel = level; }
+  // For a calculating operation: how it was converted to fixed point, or null for an
+  // operation without conversion.
+  KV_OpConversionInfo* getConversionInfo() const;
+  void setConversionInfo(bool calculateProtected);
+  // The result range in implemented units (the float range [0, 0] when none was set).
+  const KV_Range& getResultRange() const;
+  void setResultRange(const KV_Range& range);
   // Where the operation came from, or null. Not owned.
   const KvCSrcRef* getSourceRef() const { return srcRef; }
   void setSourceRef(const KvCSrcRef* ref) { srcRef = ref; }
@@ -72,6 +82,10 @@ private:
   KV_Scaling* scaling = nullptr;
   KV_OpConversionLevel* conversionLevel = nullptr;
   const KvCSrcRef* srcRef = nullptr;
+  // Conversion data of calculating operations, made on first use (most operations have
+  // none).
+  struct Calculation;
+  std::unique_ptr<Calculation> calculation;
 };
 
 #endif
