@@ -84,8 +84,9 @@ public:
   bool isFloat() const override { return floating; }
   int getBits() const { return bits; }
   bool isSigned() const { return isSignedType; }
-  // Range handling does not apply to floating-point types and to types marked exempt.
-  bool isExemptFromRangeHandling() const { return floating || exempt; }
+  // Whether the code generator keeps its range handling (saturation, rounding of limits)
+  // off this type; set per type by the code generator.
+  bool isExemptFromRangeHandling() const { return exempt; }
   void setExemptFromRangeHandling(bool value) { exempt = value; }
   // The limits of an integer type (0 for floating-point types).
   std::int64_t getMinValue() const;
