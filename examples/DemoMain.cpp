@@ -43,6 +43,7 @@ int main(int argc, char** argv) {
     demoElocQuery(run);
     demoExprLocDB(run);
     demoCallGraph(run);
+    demoFixedPoint(run);
   }
 
   printSectionTitle(out, "Shutdown");

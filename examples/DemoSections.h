@@ -31,5 +31,7 @@ void demoElocQuery(DemoRun& run);
 void demoExprLocDB(DemoRun& run);
 // The call graph, the functions on call cycles, inlining costs.
 void demoCallGraph(DemoRun& run);
+// Constants in relations scaled and rounded; absolute values.
+void demoFixedPoint(DemoRun& run);
 
 #endif

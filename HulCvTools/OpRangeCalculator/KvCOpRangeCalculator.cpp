@@ -48,10 +48,9 @@ void KvCOpRangeCalculator::toImplementedIntRange(KV_OpOperator* op, KV_Range& ra
 }
 
 bool KvCOpRangeCalculator::calcRangesForAbs(KV_OpOperator* pRelatOperator,
-                                            const KV_Range& argumentRange,
-                                            KV_NumericalType* type, KV_Scaling* scaling,
-                                            const KvCSrcRef* srcRef, KV_Range& plainRange,
-                                            KV_Range& negatedRange) {
+                                            const KV_Range& argumentRange, KV_NumericalType* type,
+                                            KV_Scaling* scaling, const KvCSrcRef* srcRef,
+                                            KV_Range& plainRange, KV_Range& negatedRange) {
   plainRange.setLimits(argumentRange);
   negatedRange.setLimits(argumentRange);
   if (pRelatOperator->isGreater()) {
@@ -93,9 +92,9 @@ bool KvCOpRangeCalculator::checkSaturation(const KV_Range& range, KV_OpSaturatio
 
 bool KvCOpRangeCalculator::checkSaturationForAbs(const KV_Range& plainRange,
                                                  const KV_Range& negatedRange,
-                                                 KV_OpSaturationInfo* saturation,
-                                                 bool& plainUpper, bool& plainLower,
-                                                 bool& negatedUpper, bool& negatedLower) {
+                                                 KV_OpSaturationInfo* saturation, bool& plainUpper,
+                                                 bool& plainLower, bool& negatedUpper,
+                                                 bool& negatedLower) {
   plainUpper = plainLower = negatedUpper = negatedLower = false;
   const bool first = checkSaturation(plainRange, saturation, plainUpper, plainLower);
   const bool second = checkSaturation(negatedRange, saturation, negatedUpper, negatedLower);

@@ -32,8 +32,8 @@ public:
                         KV_NumericalType* type, KV_Scaling* scaling, const KvCSrcRef* srcRef,
                         KV_Range& plainRange, KV_Range& negatedRange);
   bool checkSaturationForAbs(const KV_Range& plainRange, const KV_Range& negatedRange,
-                             KV_OpSaturationInfo* saturation, bool& plainUpper,
-                             bool& plainLower, bool& negatedUpper, bool& negatedLower);
+                             KV_OpSaturationInfo* saturation, bool& plainUpper, bool& plainLower,
+                             bool& negatedUpper, bool& negatedLower);
   // Whether an integer range (implemented units) exceeds constant saturation limits; a
   // side with a limit computed at run time always needs saturation.
   bool checkSaturation(const KV_Range& range, KV_OpSaturationInfo* saturation, bool& upper,
