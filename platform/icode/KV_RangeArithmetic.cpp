@@ -110,7 +110,11 @@ double KvCScaleTool::calcImplementedMax(const KV_NumericalType* type, const KV_S
 void KvCRangeConverter::scaleToFloat(KV_Range& range, const KV_Scaling* scaling) {
   const double a = KvCScaleTool::scaleFixedToFloat(range.getFloatLowerLimit(), scaling);
   const double b = KvCScaleTool::scaleFixedToFloat(range.getFloatUpperLimit(), scaling);
-  range.setFloatLimits(std::min(a, b), std::max(a, b));
+  // Only a negative LSB swaps the limits: an empty range stays empty, a NaN limit stays put.
+  if (lsbOf(scaling) < 0.0)
+    range.setFloatLimits(b, a);
+  else
+    range.setFloatLimits(a, b);
 }
 
 // --- KV_RangeLimiter
@@ -219,5 +223,9 @@ void KV_RangeLimiter::limitLower(KV_Range& range, double limit) {
 void ASC_MulRangeWithConst(KV_Range& range, double factor, const KvCSrcRef* /*srcRef*/) {
   const double a = range.getFloatLowerLimit() * factor;
   const double b = range.getFloatUpperLimit() * factor;
-  range.setFloatLimits(std::min(a, b), std::max(a, b));
+  // Only a negative factor swaps the limits: an empty range stays empty.
+  if (factor < 0.0)
+    range.setFloatLimits(b, a);
+  else
+    range.setFloatLimits(a, b);
 }
