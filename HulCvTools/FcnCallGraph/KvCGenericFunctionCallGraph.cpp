@@ -5,6 +5,7 @@
 #include "HulCvTools/FcnCallGraph/KvCFcnSmbVisitor.h"
 #include "HulCvTools/ModelInterfaces/ICodeModel.h"
 
+#include <algorithm>
 #include <cstdint>
 
 // The graph type every call graph of the library derives from, instantiated and exported
@@ -129,8 +130,114 @@ KvCGenericFunctionCallGraph::~KvCGenericFunctionCallGraph() { deleteAllEdges(); 
 
 // --- construction
 
+namespace {
+
+// Collects, in symbol database order, the function and macro symbols that construction
+// visits, skipping the first `skip` entries (those collected already).
+class KvCFcnSmbCollector : public KV_SmbDBObjVisitor {
+public:
+  KvCFcnSmbCollector(std::vector<KvCParamSymbol*>& out, std::size_t skip, bool visitAll)
+      : functions(out), toSkip(skip), visitAllSymbols(visitAll) {}
+
+  void visitParamSmbDBObj(KV_ParamSmbDBObj* entry) override {
+    if (!entry || visited++ < toSkip)
+      return;
+    if (!visitAllSymbols && !(entry->getSymbol() && entry->getSymbol()->isSelected()))
+      return;
+    if (KvCParamSymbol* function = entry->getParamSymbol())
+      functions.push_back(function);
+  }
+
+  std::size_t visited = 0;
+
+private:
+  std::vector<KvCParamSymbol*>& functions;
+  std::size_t toSkip;
+  bool visitAllSymbols;
+};
+
+inline void prefetch(const void* p) {
+  if (p)
+    __builtin_prefetch(p);
+}
+
+// Walks a group of uses up the model far enough to know each call's calling function
+// info, issuing a prefetch at every step. The uses of one group are independent, so
+// their cache misses overlap instead of being taken one after another when the calls are
+// entered. Only a hint: the entering code asks the model again.
+class KvCUsePrefetcher {
+public:
+  static constexpr std::size_t kGroup = 32;
+
+  void run(KV_ExprLocation* const* uses, std::size_t n) {
+    for (std::size_t j = 0; j < n; ++j) {
+      const KV_ExprLocation* use = uses[j];
+      prefetch(use->getExpression());
+      cursor[j] = use->getParent();
+      prefetch(cursor[j]);
+      state[j] = kCall;
+    }
+    for (int round = 0; round < kRounds; ++round)
+      for (std::size_t j = 0; j < n; ++j)
+        step(j);
+  }
+
+private:
+  enum State : unsigned char { kCall, kHolder, kStatement, kTable, kSymbol, kDone };
+  static constexpr int kRounds = 8;
+
+  void step(std::size_t j) {
+    KV_ICodeElem* e = cursor[j];
+    if (!e) {
+      state[j] = kDone;
+      return;
+    }
+    switch (state[j]) {
+    case kCall: {
+      KV_Operation* op = e->asOperation();
+      KvCCallOperation* call = op ? op->asCallOperation() : nullptr;
+      advance(j, call ? call->getParent() : nullptr, kHolder);
+      break;
+    }
+    case kHolder:
+      advance(j, e->getParentElem(), kStatement);
+      break;
+    case kStatement:
+      if (KV_Statement* statement = e->asStatement())
+        advance(j, statement->getParentCTable(), kTable);
+      else
+        advance(j, e->getParentElem(), kStatement);
+      break;
+    case kTable: {
+      KvCParamSymbol* symbol = static_cast<KvCCStmTable*>(e)->getCodeBlockSymbol();
+      prefetch(symbol);
+      symbols[j] = symbol;
+      state[j] = symbol ? kSymbol : kDone;
+      break;
+    }
+    case kSymbol:
+      prefetch(symbols[j]->getFunctionInfo());
+      state[j] = kDone;
+      break;
+    case kDone:
+      break;
+    }
+  }
+
+  void advance(std::size_t j, KV_ICodeElem* next, State s) {
+    prefetch(next);
+    cursor[j] = next;
+    state[j] = next ? s : kDone;
+  }
+
+  KV_ICodeElem* cursor[kGroup] = {};
+  KvCParamSymbol* symbols[kGroup] = {};
+  State state[kGroup] = {};
+};
+
+} // namespace
+
 bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
-  KvCFcnSmbVisitor visitor(this, !onlySelected);
   incomplete = false;
   restore_all_edges();
   deleteAllEdges();
@@ -140,8 +247,53 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
     incomplete = true;
     return false;
   }
-  data->getSymbolDB()->forallParametrizedSymbols(&visitor);
+  // The symbols are listed first and then treated in that order, the uses of all of them
+  // in one sequence, so that prefetching runs ahead across symbol boundaries (a scheduler's
+  // callees have one use each). Symbols made while treating are listed by a further walk.
+  std::size_t listed = 0;
+  for (;;) {
+    std::vector<KvCParamSymbol*> functions;
+    KvCFcnSmbCollector collector(functions, listed, !onlySelected);
+    data->getSymbolDB()->forallParametrizedSymbols(&collector);
+    if (collector.visited <= listed)
+      break;
+    listed = collector.visited;
+    treatFcnSymbols(functions);
+  }
   return !incomplete;
+}
+
+void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymbol*>& functions) {
+  // All uses, each symbol's in ascending serial order, and where each symbol's start.
+  useBuffer.clear();
+  std::vector<std::size_t> starts;
+  starts.reserve(functions.size() + 1);
+  std::vector<KV_ExprLocation*> uses;
+  for (KvCParamSymbol* function : functions) {
+    starts.push_back(useBuffer.size());
+    function->getExprLocDB()->listUses(uses);
+    useBuffer.insert(useBuffer.end(), uses.begin(), uses.end());
+  }
+  starts.push_back(useBuffer.size());
+
+  KvCUsePrefetcher prefetcher;
+  std::size_t prefetched = 0;
+  for (std::size_t f = 0; f < functions.size(); ++f) {
+    KvCParamSymbol* function = functions[f];
+    KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
+    if (!info)
+      continue;
+    registerNode(info);
+    synchronizeNodeInfoAtConstruction(info, function);
+    for (std::size_t u = starts[f]; u < starts[f + 1]; ++u) {
+      if (u == prefetched) {
+        const std::size_t n = std::min(KvCUsePrefetcher::kGroup, useBuffer.size() - u);
+        prefetcher.run(useBuffer.data() + u, n);
+        prefetched = u + n;
+      }
+      enterUse(useBuffer[u]);
+    }
+  }
 }
 
 void KvCGenericFunctionCallGraph::treatFcnSymbolByUses(KvCParamSymbol* function) {
@@ -152,16 +304,19 @@ void KvCGenericFunctionCallGraph::treatFcnSymbolByUses(KvCParamSymbol* function)
     return;
   registerNode(info);
   synchronizeNodeInfoAtConstruction(info, function);
-  for (KV_ExprLocation* use : useBuffer) {
-    KV_Operation* op = use->getOperation();
-    if (!op) {
-      incomplete = true;
-      continue;
-    }
-    KV_Operation* above = op->getParentOperation();
-    if (KvCCallOperation* call = above ? above->asCallOperation() : nullptr)
-      addCall(call);
+  for (KV_ExprLocation* use : useBuffer)
+    enterUse(use);
+}
+
+void KvCGenericFunctionCallGraph::enterUse(KV_ExprLocation* use) {
+  KV_Operation* op = use->getOperation();
+  if (!op) {
+    incomplete = true;
+    return;
   }
+  KV_Operation* above = op->getParentOperation();
+  if (KvCCallOperation* call = above ? above->asCallOperation() : nullptr)
+    addCall(call);
 }
 
 // --- single calls
@@ -321,10 +476,11 @@ void KvCGenericFunctionCallGraph::removeCalledEdges(KvCFcgFunctionInfo* function
 
 void KvCGenericFunctionCallGraph::deleteAllEdges() {
   restore_all_edges();
-  for (leda::edge e : all_edges()) {
+  // The infos go in edge creation order; the records then all at once (unlinking them one
+  // by one would visit each edge's neighbours, scattered over memory).
+  for (leda::edge e : all_edges())
     deleteFcgEdgeInfo(inf(e));
-    del_edge(e);
-  }
+  del_all_edges();
   edgeIndex->clear();
 }
 

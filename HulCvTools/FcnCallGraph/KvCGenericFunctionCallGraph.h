@@ -116,6 +116,10 @@ private:
   friend class KvCFcnSmbVisitor;
 
   void treatFcnSymbolByUses(KvCParamSymbol* function);
+  // Treats the symbols in order as treatFcnSymbolByUses would, prefetching ahead.
+  void treatFcnSymbols(const std::vector<KvCParamSymbol*>& functions);
+  // Enters the call of which `use` is an operand, if any.
+  void enterUse(KV_ExprLocation* use);
   // The function's node, registered when missing (one map lookup).
   leda::node nodeOf(KvCFcgFunctionInfo* function);
   bool isEnteredOutsideFunctions(KvCCallOperation* call) const;

@@ -9,15 +9,21 @@
 // where it was created. Every node and edge gets an index that is unique in
 // its graph and never reused, not even after clear().
 //
+// The records live in per-graph pools (see RecordPool): records made in sequence
+// lie together in memory, and deleting every edge (del_all_edges) or everything
+// (clear) is one pass without unlinking.
+//
 // Undirected graphs, edge reversal and reordering of edges are not provided.
 #ifndef HULCVTOOLS_PLATFORM_LEDA_GRAPH_H
 #define HULCVTOOLS_PLATFORM_LEDA_GRAPH_H
 
 #include "platform/leda/array.h"
 
+#include <algorithm>
 #include <cassert>
 #include <cstddef>
 #include <iterator>
+#include <new>
 #include <utility>
 #include <vector>
 
@@ -145,6 +151,73 @@ template <EdgeRec* EdgeRec::*Next> EdgeRec* firstVisible(EdgeRec* e) {
   return e;
 }
 
+// Storage for the records of one kind of one graph: fixed-size slots carved from chunks
+// in address order, freed slots kept on a free list. Records made one after another lie
+// next to each other, and once every record is gone (clear, del_all_edges) allocation
+// starts again at the first chunk, so a graph rebuilt edge by edge reuses the same warm
+// memory in the same order. Chunks are returned only when the graph is destroyed.
+class RecordPool {
+public:
+  explicit RecordPool(std::size_t slotSize)
+      : slot_((std::max(slotSize, sizeof(void*)) + alignof(std::max_align_t) - 1) /
+              alignof(std::max_align_t) * alignof(std::max_align_t)) {}
+  RecordPool(const RecordPool&) = delete;
+  RecordPool& operator=(const RecordPool&) = delete;
+  ~RecordPool() {
+    for (Chunk& c : chunks_)
+      ::operator delete (c.memory, std::align_val_t{alignof(std::max_align_t)});
+  }
+
+  std::size_t slotSize() const { return slot_; }
+
+  void* allocate() {
+    if (free_) {
+      void* p = free_;
+      free_ = *static_cast<void**>(p);
+      return p;
+    }
+    if (chunk_ == chunks_.size() || used_ == chunks_[chunk_].slots) {
+      if (chunk_ < chunks_.size())
+        ++chunk_;
+      used_ = 0;
+      if (chunk_ == chunks_.size()) {
+        const std::size_t slots =
+            chunks_.empty() ? kFirstSlots : std::min(chunks_.back().slots * 2, kMaxSlots);
+        chunks_.push_back(Chunk{static_cast<char*>(::operator new (
+                                    slots* slot_, std::align_val_t{alignof(std::max_align_t)})),
+                                slots});
+      }
+    }
+    return chunks_[chunk_].memory + slot_ * used_++;
+  }
+
+  void release(void* p) {
+    *static_cast<void**>(p) = free_;
+    free_ = p;
+  }
+
+  // Forgets every slot; only when no record lives.
+  void reset() {
+    free_ = nullptr;
+    chunk_ = 0;
+    used_ = 0;
+  }
+
+private:
+  struct Chunk {
+    char* memory;
+    std::size_t slots;
+  };
+  static constexpr std::size_t kFirstSlots = 64;
+  static constexpr std::size_t kMaxSlots = 16384;
+
+  std::size_t slot_;
+  std::vector<Chunk> chunks_;
+  std::size_t chunk_ = 0; // chunk being carved
+  std::size_t used_ = 0;  // slots of it handed out
+  void* free_ = nullptr;
+};
+
 } // namespace detail
 
 using node = detail::NodeRec*;
@@ -165,7 +238,7 @@ public:
   using OutEdgeRange = detail::Range<OutEdgeIterator>;
   using InEdgeRange = detail::Range<InEdgeIterator>;
 
-  graph() = default;
+  graph() : graph(sizeof(detail::NodeRec), sizeof(detail::EdgeRec)) {}
   graph(const graph&) = delete;
   graph& operator=(const graph&) = delete;
   virtual ~graph() { clear(); }
@@ -183,7 +256,7 @@ public:
     (v->prev ? v->prev->next : firstNode_) = v->next;
     (v->next ? v->next->prev : lastNode_) = v->prev;
     --nodeCount_;
-    delete v;
+    destroyNode(v);
   }
 
   // Deletes e, which may be hidden. O(1).
@@ -200,21 +273,41 @@ public:
     (e->inPrev ? e->inPrev->inNext : e->tgt->inFirst) = e->inNext;
     (e->inNext ? e->inNext->inPrev : e->tgt->inLast) = e->inPrev;
     --edgeCount_;
-    delete e;
+    destroyEdge(e);
+  }
+
+  // Deletes every edge, hidden ones included; the nodes stay, without edges. O(nodes +
+  // edges), without the per-edge unlinking of del_edge.
+  void del_all_edges() {
+    for (edge e = firstEdge_; e;) {
+      edge next = e->next;
+      e->~EdgeRec();
+      e = next;
+    }
+    edgePool_.reset();
+    firstEdge_ = lastEdge_ = nullptr;
+    edgeCount_ = 0;
+    hidden_.clear();
+    for (node v = firstNode_; v; v = v->next) {
+      v->outFirst = v->outLast = v->inFirst = v->inLast = nullptr;
+      v->outdeg = v->indeg = 0;
+    }
   }
 
   // Deletes all nodes and edges. Indices of later elements keep counting up.
   void clear() {
     for (edge e = firstEdge_; e;) {
       edge next = e->next;
-      delete e;
+      e->~EdgeRec();
       e = next;
     }
     for (node v = firstNode_; v;) {
       node next = v->next;
-      delete v;
+      v->~NodeRec();
       v = next;
     }
+    edgePool_.reset();
+    nodePool_.reset();
     firstNode_ = lastNode_ = nullptr;
     firstEdge_ = lastEdge_ = nullptr;
     nodeCount_ = edgeCount_ = 0;
@@ -291,10 +384,30 @@ public:
   InEdgeRange in_edges(node v) const { return InEdgeRange(InEdgeIterator(v->inFirst)); }
 
 protected:
+  // Records are made in the graph's pools, whose slots have the given sizes (those of
+  // the largest record types the graph makes).
+  graph(std::size_t nodeSize, std::size_t edgeSize) : nodePool_(nodeSize), edgePool_(edgeSize) {}
+
   // Record factories for new_node() / new_edge(); GRAPH makes records that
   // carry a default payload.
-  virtual detail::NodeRec* makeNode() { return new detail::NodeRec; }
-  virtual detail::EdgeRec* makeEdge() { return new detail::EdgeRec; }
+  virtual detail::NodeRec* makeNode() {
+    return new (nodeMemory(sizeof(detail::NodeRec))) detail::NodeRec;
+  }
+  virtual detail::EdgeRec* makeEdge() {
+    return new (edgeMemory(sizeof(detail::EdgeRec))) detail::EdgeRec;
+  }
+
+  // Uninitialised memory for a record of `size` bytes.
+  void* nodeMemory(std::size_t size) {
+    assert(size <= nodePool_.slotSize());
+    (void)size;
+    return nodePool_.allocate();
+  }
+  void* edgeMemory(std::size_t size) {
+    assert(size <= edgePool_.slotSize());
+    (void)size;
+    return edgePool_.allocate();
+  }
 
   node linkNode(detail::NodeRec* v) {
     v->id = nextNodeId_++;
@@ -325,6 +438,15 @@ protected:
   }
 
 private:
+  void destroyNode(node v) {
+    v->~NodeRec();
+    nodePool_.release(v);
+  }
+  void destroyEdge(edge e) {
+    e->~EdgeRec();
+    edgePool_.release(e);
+  }
+
   static void adjustDegrees(edge e, int delta) {
     e->src->outdeg += delta;
     e->tgt->indeg += delta;
@@ -348,6 +470,8 @@ private:
   int nextNodeId_ = 0;
   int nextEdgeId_ = 0;
   std::vector<edge> hidden_;
+  detail::RecordPool nodePool_;
+  detail::RecordPool edgePool_;
 };
 
 // A graph whose nodes carry a V and whose edges carry an E. new_node() and
@@ -358,8 +482,14 @@ public:
   using graph::new_edge;
   using graph::new_node;
 
-  node new_node(const V& x) { return linkNode(new detail::NodeRecOf<V>(x)); }
-  edge new_edge(node v, node w, const E& x) { return linkEdge(new detail::EdgeRecOf<E>(x), v, w); }
+  GRAPH() : graph(sizeof(detail::NodeRecOf<V>), sizeof(detail::EdgeRecOf<E>)) {}
+
+  node new_node(const V& x) {
+    return linkNode(new (nodeMemory(sizeof(detail::NodeRecOf<V>))) detail::NodeRecOf<V>(x));
+  }
+  edge new_edge(node v, node w, const E& x) {
+    return linkEdge(new (edgeMemory(sizeof(detail::EdgeRecOf<E>))) detail::EdgeRecOf<E>(x), v, w);
+  }
 
   const V& inf(node v) const { return payload(v); }
   const E& inf(edge e) const { return payload(e); }
@@ -371,8 +501,12 @@ public:
   void assign(edge e, const E& x) { payload(e) = x; }
 
 protected:
-  detail::NodeRec* makeNode() override { return new detail::NodeRecOf<V>(V()); }
-  detail::EdgeRec* makeEdge() override { return new detail::EdgeRecOf<E>(E()); }
+  detail::NodeRec* makeNode() override {
+    return new (nodeMemory(sizeof(detail::NodeRecOf<V>))) detail::NodeRecOf<V>(V());
+  }
+  detail::EdgeRec* makeEdge() override {
+    return new (edgeMemory(sizeof(detail::EdgeRecOf<E>))) detail::EdgeRecOf<E>(E());
+  }
 
 private:
   static V& payload(node v) { return static_cast<detail::NodeRecOf<V>*>(v)->inf; }

@@ -6,9 +6,9 @@
 // given in order of each component's first node in node creation order.
 //
 // The search is Tarjan's algorithm run with explicit stacks (no recursion, so
-// deep graphs do not exhaust the call stack). Each node keeps its position in
-// its out-edge list, so every edge is examined once: O(V + E) time, hidden
-// edges included in E, and O(max node index) memory.
+// deep graphs do not exhaust the call stack) over a compact copy of the visible
+// edges. Each node keeps its position in its out-edges, so every edge is examined
+// once: O(V + E) time, hidden edges included in E, and O(max node index + E) memory.
 #ifndef HULCVTOOLS_PLATFORM_LEDA_STRONG_COMPONENTS_H
 #define HULCVTOOLS_PLATFORM_LEDA_STRONG_COMPONENTS_H
 
@@ -22,76 +22,81 @@ namespace leda {
 namespace detail {
 
 // One-shot state of a component search over a graph that must not change
-// while the search runs.
+// while the search runs. The visible edges are first copied, in creation order, into
+// per-node arrays of target indices (a stable counting sort by source), so the search
+// reads contiguous integers instead of following edge records scattered over memory.
 class SccSearch {
 public:
   explicit SccSearch(const graph& G)
       : G_(G), bound_(static_cast<std::size_t>(G.max_node_index() + 1)), order_(bound_, -1),
-        low_(bound_, 0), onStack_(bound_, 0), cursor_(bound_, nullptr), comp_(bound_, -1) {}
+        low_(bound_, 0), onStack_(bound_, 0), cursor_(bound_, 0), comp_(bound_, -1),
+        firstOut_(bound_ + 1, 0) {
+    for (edge e : G_.all_edges())
+      ++firstOut_[slot(e->src) + 1];
+    for (std::size_t i = 0; i < bound_; ++i)
+      firstOut_[i + 1] += firstOut_[i];
+    targets_.resize(firstOut_[bound_]);
+    std::vector<std::size_t> fill(firstOut_.begin(), firstOut_.end() - 1);
+    for (edge e : G_.all_edges())
+      targets_[fill[slot(e->src)]++] = e->tgt->id;
+  }
 
   int run(node_array<int>& compnum) {
     for (node v : G_.all_nodes()) {
       if (order_[slot(v)] < 0)
-        searchFrom(v);
+        searchFrom(v->id);
     }
     return renumber(compnum);
   }
 
 private:
   static std::size_t slot(node v) { return static_cast<std::size_t>(v->id); }
+  static std::size_t at(int v) { return static_cast<std::size_t>(v); }
 
-  void discover(node v) {
-    order_[slot(v)] = low_[slot(v)] = counter_++;
-    cursor_[slot(v)] = v->outFirst;
-    onStack_[slot(v)] = 1;
+  void discover(int v) {
+    order_[at(v)] = low_[at(v)] = counter_++;
+    cursor_[at(v)] = firstOut_[at(v)];
+    onStack_[at(v)] = 1;
     sccStack_.push_back(v);
     callStack_.push_back(v);
   }
 
-  // Next visible out-edge of v not examined yet, or nullptr.
-  edge nextEdge(node v) {
-    edge e = cursor_[slot(v)];
-    while (e && e->hidden())
-      e = e->outNext;
-    cursor_[slot(v)] = e ? e->outNext : nullptr;
-    return e;
-  }
-
-  void searchFrom(node root) {
+  void searchFrom(int root) {
     discover(root);
     while (!callStack_.empty()) {
-      node v = callStack_.back();
-      if (edge e = nextEdge(v)) {
-        visitEdge(v, e->tgt);
+      const int v = callStack_.back();
+      std::size_t& next = cursor_[at(v)];
+      if (next < firstOut_[at(v) + 1]) {
+        visitEdge(v, targets_[next++]);
         continue;
       }
       callStack_.pop_back();
-      if (low_[slot(v)] == order_[slot(v)])
+      if (low_[at(v)] == order_[at(v)])
         closeComponent(v);
       if (!callStack_.empty()) {
-        int& parentLow = low_[slot(callStack_.back())];
-        parentLow = std::min(parentLow, low_[slot(v)]);
+        int& parentLow = low_[at(callStack_.back())];
+        parentLow = std::min(parentLow, low_[at(v)]);
       }
     }
   }
 
-  void visitEdge(node v, node w) {
-    if (order_[slot(w)] < 0) {
+  void visitEdge(int v, int w) {
+    if (order_[at(w)] < 0) {
       discover(w);
       return;
     }
-    if (onStack_[slot(w)])
-      low_[slot(v)] = std::min(low_[slot(v)], order_[slot(w)]);
+    if (onStack_[at(w)])
+      low_[at(v)] = std::min(low_[at(v)], order_[at(w)]);
   }
 
   // Pops the component rooted at root off the search stack.
-  void closeComponent(node root) {
-    node w = nullptr;
+  void closeComponent(int root) {
+    int w = -1;
     do {
       w = sccStack_.back();
       sccStack_.pop_back();
-      onStack_[slot(w)] = 0;
-      comp_[slot(w)] = components_;
+      onStack_[at(w)] = 0;
+      comp_[at(w)] = components_;
     } while (w != root);
     ++components_;
   }
@@ -113,10 +118,12 @@ private:
   std::vector<int> order_; // discovery number, -1 if not yet discovered
   std::vector<int> low_;
   std::vector<char> onStack_;
-  std::vector<edge> cursor_;
-  std::vector<int> comp_; // component number in completion order
-  std::vector<node> sccStack_;
-  std::vector<node> callStack_;
+  std::vector<std::size_t> cursor_;   // next position in targets_ to examine
+  std::vector<int> comp_;             // component number in completion order
+  std::vector<std::size_t> firstOut_; // node i's targets: [firstOut_[i], firstOut_[i + 1])
+  std::vector<int> targets_;
+  std::vector<int> sccStack_;
+  std::vector<int> callStack_;
   int counter_ = 0;
   int components_ = 0;
 };
