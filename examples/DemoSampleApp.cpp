@@ -107,7 +107,9 @@ std::string renderAccess(KV_QualifiedSymbolOp* qso) {
   std::string text = qso->getSymbol()->getName().str();
   for (int d = 0; d < qso->getResolvedNumberOfDims(); ++d) {
     KV_ExprLocation* index = qso->getIndexElocForDim(d);
-    text += "[" + (index ? renderExpression(index) : std::to_string(qso->getIndexForDim(d))) + "]";
+    text.append("[")
+        .append(index ? renderExpression(index) : std::to_string(qso->getIndexForDim(d)))
+        .append("]");
   }
   return text;
 }
@@ -118,9 +120,12 @@ std::string renderOperation(KV_Operation* op) {
     return renderExpression(op->getOperand(0)) + symbol + renderExpression(op->getOperand(1));
   switch (kind) {
   case KV_OP_CAST:
-    return "(" + op->getDataType()->getName().str() + ")" + renderExpression(op->getOperand(0));
+    return std::string("(")
+        .append(op->getDataType()->getName().str())
+        .append(")")
+        .append(renderExpression(op->getOperand(0)));
   case KV_OP_ADDRESS_OF:
-    return "&" + renderExpression(op->getOperand(0));
+    return std::string("&").append(renderExpression(op->getOperand(0)));
   case KV_OP_POST_INCREMENT:
     return renderExpression(op->getOperand(0)) + "++";
   case KV_OP_PARAMETER:

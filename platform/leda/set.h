@@ -11,7 +11,9 @@
 #include "platform/leda/compare.h"
 
 #include <cassert>
+#include <iterator>
 #include <set>
+#include <utility>
 
 namespace leda {
 
@@ -27,17 +29,53 @@ public:
 
   set() = default;
   explicit set(detail::CompareFn<T> cmp) : items_(detail::FnLess<T>{cmp}) {}
+  set(const set& other) : items_(other.items_) {}
+  set(set&& other) noexcept : items_(std::move(other.items_)) {
+    other.finger_ = other.items_.end();
+  }
+  set& operator=(const set& other) {
+    items_ = other.items_;
+    finger_ = items_.end();
+    return *this;
+  }
+  set& operator=(set&& other) noexcept {
+    items_ = std::move(other.items_);
+    finger_ = items_.end();
+    other.finger_ = other.items_.end();
+    return *this;
+  }
 
   // Returns false if an equal element was already present (it is kept).
   // Elements arriving in ascending order (the common case: symbols met in creation
-  // order) are appended in O(1) amortized; others cost O(log n).
+  // order, again and again) cost O(1) amortized: the set remembers where the last
+  // insertion ended (a finger) and looks right after it first. Others cost O(log n).
   bool insert(const T& x) {
+    const detail::FnLess<T>& less = items_.key_comp();
+    if (finger_ != items_.end()) {
+      auto after = std::next(finger_);
+      if (after != items_.end() && !less(*after, x) && !less(x, *after)) {
+        finger_ = after; // present already, right after the last one
+        return false;
+      }
+      if (less(*finger_, x) && (after == items_.end() || less(x, *after))) {
+        finger_ = items_.insert(after, x);
+        return true;
+      }
+    }
     const std::size_t before = items_.size();
-    items_.insert(items_.end(), x);
+    finger_ = items_.insert(items_.end(), x);
     return items_.size() != before;
   }
   // Returns false if no equal element was present.
-  bool del(const T& x) { return items_.erase(x) != 0; }
+  bool del(const T& x) {
+    auto it = items_.find(x);
+    if (it == items_.end())
+      return false;
+    if (it == finger_)
+      finger_ = items_.end();
+    items_.erase(it);
+    return true;
+  }
   bool erase(const T& x) { return del(x); }
 
   bool member(const T& x) const { return items_.find(x) != items_.end(); }
@@ -45,7 +83,10 @@ public:
 
   int size() const { return static_cast<int>(items_.size()); }
   bool empty() const { return items_.empty(); }
-  void clear() { items_.clear(); }
+  void clear() {
+    items_.clear();
+    finger_ = items_.end();
+  }
 
   const T& min() const {
     assert(!items_.empty());
@@ -84,6 +125,8 @@ private:
   }
 
   Tree items_;
+  // Where the last insertion ended, or end(); reset by whatever could invalidate it.
+  typename Tree::iterator finger_ = items_.end();
 };
 
 } // namespace leda
