@@ -52,7 +52,9 @@ public:
   bool insert(const T& x) {
     const detail::FnLess<T>& less = items_.key_comp();
     if (finger_ != items_.end()) {
-      auto after = std::next(finger_);
+      // The last element is known in O(1); stepping past it would climb the tree.
+      const bool atLast = finger_ == std::prev(items_.end());
+      auto after = atLast ? items_.end() : std::next(finger_);
       if (after != items_.end() && !less(*after, x) && !less(x, *after)) {
         finger_ = after; // present already, right after the last one
         return false;
