@@ -123,79 +123,73 @@ private:
     return true;
   }
 
-  // Steps 1 and 2.1/2.2 shared by the logic and bit comparisons. Answers whether the pair
-  // can still be equal; `decided` is set when the answer is final (constants, accesses).
-  bool commonPrefix(KV_ExprLocation* a, KV_ExprLocation* b, KV_Operation*& oa, KV_Operation*& ob,
-                    bool& decided) {
-    decided = true;
+  // What the logic and bit comparisons check alike before their operator rules: location
+  // types and scalings, constants, conversion levels and scalings, symbol accesses.
+  struct Shared {
+    bool decided = true; // the answer is `result`; otherwise the operator rules decide
+    bool result = false;
+    KV_Operation* oa = nullptr;
+    KV_Operation* ob = nullptr;
+    KV_OpOperator* ka = nullptr;
+    KV_OpOperator* kb = nullptr;
+  };
+
+  static Shared sharedChecks(KV_ExprLocation* a, KV_ExprLocation* b) {
+    Shared s;
     if (!a || !b || !Comparer::areElocTypeAndScalingEqual(a, b))
-      return false;
-    oa = a->getOperation();
-    ob = b->getOperation();
-    if (!oa || !ob)
-      return areConstantsEqual(a->getConstant(), b->getConstant());
-    if (!Comparer::areOpConvLevelAndScalingEqual(oa, ob))
-      return false;
-    if (KV_QualifiedSymbolOp* qa = oa->asQualifiedSymbolOp()) {
-      KV_QualifiedSymbolOp* qb = ob->asQualifiedSymbolOp();
-      return qb && qa->isEqual(qb, false);
+      return s;
+    s.oa = a->getOperation();
+    s.ob = b->getOperation();
+    if (!s.oa || !s.ob) {
+      s.result = areConstantsEqual(a->getConstant(), b->getConstant());
+      return s;
     }
-    decided = false;
+    if (!Comparer::areOpConvLevelAndScalingEqual(s.oa, s.ob))
+      return s;
+    if (KV_QualifiedSymbolOp* qa = s.oa->asQualifiedSymbolOp()) {
+      KV_QualifiedSymbolOp* qb = s.ob->asQualifiedSymbolOp();
+      s.result = qb && qa->isEqual(qb, false);
+      return s;
+    }
+    s.ka = s.oa->getOperator();
+    s.kb = s.ob->getOperator();
+    s.decided = !s.ka || !s.kb;
+    return s;
+  }
+
+  // Equal operators, then the operands 0 (and 1 for a binary rule) must be equal too.
+  bool requireOperands(Mode mode, const Shared& s, bool binary) {
+    if (!(*s.ka == *s.kb))
+      return false;
+    if (binary)
+      pushOperand(mode, s.oa, s.ob, 1);
+    pushOperand(mode, s.oa, s.ob, 0);
     return true;
   }
 
   bool logic(KV_ExprLocation* a, KV_ExprLocation* b, bool unaryOnly) {
-    KV_Operation* oa = nullptr;
-    KV_Operation* ob = nullptr;
-    bool decided = false;
-    const bool possible = commonPrefix(a, b, oa, ob, decided);
-    if (decided || !possible)
-      return possible;
-    KV_OpOperator* ka = oa->getOperator();
-    KV_OpOperator* kb = ob->getOperator();
-    if (!ka || !kb)
-      return false;
+    const Shared s = sharedChecks(a, b);
+    if (s.decided)
+      return s.result;
     const Mode mode = unaryOnly ? Mode::LogicUnaryOnly : Mode::Logic;
-    if (ka->isUnaryLogical()) {
-      if (!(*ka == *kb))
-        return false;
-      pushOperand(mode, oa, ob, 0);
-      return true;
-    }
-    if (unaryOnly || !ka->isLogical() || !ka->isBinary() || !(*ka == *kb))
+    if (s.ka->isUnaryLogical())
+      return requireOperands(mode, s, false);
+    if (unaryOnly || !s.ka->isLogical() || !s.ka->isBinary())
       return false;
-    pushOperand(mode, oa, ob, 1);
-    pushOperand(mode, oa, ob, 0);
-    return true;
+    return requireOperands(mode, s, true);
   }
 
   bool bitOps(KV_ExprLocation* a, KV_ExprLocation* b) {
-    KV_Operation* oa = nullptr;
-    KV_Operation* ob = nullptr;
-    bool decided = false;
-    const bool possible = commonPrefix(a, b, oa, ob, decided);
-    if (decided || !possible)
-      return possible;
-    KV_OpOperator* ka = oa->getOperator();
-    KV_OpOperator* kb = ob->getOperator();
-    if (!ka || !kb)
+    const Shared s = sharedChecks(a, b);
+    if (s.decided)
+      return s.result;
+    if (s.ka->isUnaryBitOperation())
+      return requireOperands(Mode::BitOps, s, false);
+    if (s.ka->isBitOperation() && s.ka->isBinary())
+      return requireOperands(Mode::BitOps, s, true);
+    if (!s.ka->isCast() || !s.kb->isCast() || !areCastTargetTypesEqual(s.oa, s.ob))
       return false;
-    if (ka->isUnaryBitOperation()) {
-      if (!(*ka == *kb))
-        return false;
-      pushOperand(Mode::BitOps, oa, ob, 0);
-      return true;
-    }
-    if (ka->isBitOperation() && ka->isBinary()) {
-      if (!(*ka == *kb))
-        return false;
-      pushOperand(Mode::BitOps, oa, ob, 1);
-      pushOperand(Mode::BitOps, oa, ob, 0);
-      return true;
-    }
-    if (!ka->isCast() || !kb->isCast() || !areCastTargetTypesEqual(oa, ob))
-      return false;
-    pushOperand(Mode::BitOps, oa, ob, 0);
+    pushOperand(Mode::BitOps, s.oa, s.ob, 0);
     return true;
   }
 
