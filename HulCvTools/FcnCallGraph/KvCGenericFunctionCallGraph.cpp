@@ -91,6 +91,12 @@ public:
     count = 0;
   }
 
+  // Cache hint for a lookup or insertion of the pair to come.
+  void prefetch(leda::node v, leda::node w) const {
+    if (!slots.empty())
+      __builtin_prefetch(&slots[home(v, w)]);
+  }
+
 private:
   struct Slot {
     leda::node v = nullptr;
@@ -196,6 +202,12 @@ private:
     case kCall: {
       KV_Operation* op = e->asOperation();
       KvCCallOperation* call = op ? op->asCallOperation() : nullptr;
+      if (call && call->isCallingSymbolKnown()) {
+        symbols[j] = call->getCallingSymbol();
+        prefetch(symbols[j]);
+        state[j] = symbols[j] ? kSymbol : kDone;
+        break;
+      }
       advance(j, call ? call->getParent() : nullptr, kHolder);
       break;
     }
@@ -276,6 +288,9 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
   }
   starts.push_back(useBuffer.size());
 
+  // The records are carried out in batches small enough to stay in the cache.
+  constexpr std::size_t kBatch = 2048;
+  steps.clear();
   KvCUsePrefetcher prefetcher;
   std::size_t prefetched = 0;
   for (std::size_t f = 0; f < functions.size(); ++f) {
@@ -283,17 +298,113 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
     KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
     if (!info)
       continue;
-    registerNode(info);
-    synchronizeNodeInfoAtConstruction(info, function);
+    steps.push_back(Step{Step::kNode, false, info, nullptr, function, nullptr, nullptr});
     for (std::size_t u = starts[f]; u < starts[f + 1]; ++u) {
       if (u == prefetched) {
         const std::size_t n = std::min(KvCUsePrefetcher::kGroup, useBuffer.size() - u);
         prefetcher.run(useBuffer.data() + u, n);
         prefetched = u + n;
       }
-      enterUse(useBuffer[u]);
+      recordUse(useBuffer[u]);
+    }
+    if (steps.size() >= kBatch)
+      replaySteps();
+  }
+  replaySteps();
+}
+
+void KvCGenericFunctionCallGraph::recordUse(KV_ExprLocation* use) {
+  // As enterUse and addCall decide, without changing the graph.
+  KV_Operation* op = use->getOperation();
+  if (!op) {
+    steps.push_back(Step{Step::kIncomplete, false, nullptr, nullptr, nullptr, nullptr, nullptr});
+    return;
+  }
+  KV_Operation* above = op->getParentOperation();
+  KvCCallOperation* call = above ? above->asCallOperation() : nullptr;
+  if (!call)
+    return;
+  KvCParamSymbol* calling = call->getCallingSymbol();
+  KvCParamSymbol* called = call->getCalledSymbol();
+  const bool bothEnds = calling && called;
+  KvCFcgFunctionInfo* callingInfo = bothEnds ? provideFcgNodeInfo(calling) : nullptr;
+  KvCFcgFunctionInfo* calledInfo = bothEnds ? provideFcgNodeInfo(called) : nullptr;
+  if (callingInfo && calledInfo)
+    steps.push_back(
+        Step{Step::kEdge, calling == called, callingInfo, calledInfo, nullptr, call, nullptr});
+  else
+    steps.push_back(Step{Step::kCall, false, nullptr, nullptr, nullptr, call, nullptr});
+}
+
+void KvCGenericFunctionCallGraph::replaySteps() {
+  // Each record's graph memory is fetched in stages, a stage reading only what the
+  // previous one brought in: kAhead[s] records ahead of the one carried out.
+  constexpr std::size_t kAhead[] = {12, 8, 4, 2};
+  const std::size_t n = steps.size();
+  for (std::size_t i = 0; i < n; ++i) {
+    for (int s = 0; s < 4; ++s)
+      if (i + kAhead[s] < n)
+        prefetchStep(i + kAhead[s], s);
+    const Step& step = steps[i];
+    switch (step.kind) {
+    case Step::kNode:
+      registerNode(step.calling);
+      synchronizeNodeInfoAtConstruction(step.calling, step.function);
+      break;
+    case Step::kIncomplete:
+      incomplete = true;
+      break;
+    case Step::kEdge:
+      enterEdge(step);
+      break;
+    case Step::kCall:
+      addCall(step.call);
+      break;
     }
   }
+  steps.clear();
+}
+
+void KvCGenericFunctionCallGraph::prefetchStep(std::size_t i, int stage) {
+  Step& step = steps[i];
+  if (step.kind != Step::kEdge)
+    return;
+  switch (stage) {
+  case 0:
+    nodes.prefetch_slot(step.calling);
+    prefetch(step.calling);
+    prefetch(step.call);
+    break;
+  case 1:
+    nodes.prefetch_entry(step.calling);
+    step.calling->getCalledFunctionsSet().prefetch_finger();
+    break;
+  case 2:
+    step.calling->getCalledFunctionsSet().prefetch_after_finger();
+    if (const leda::node* v = nodes.lookup(step.calling)) {
+      step.callingNode = *v;
+      if (*v) {
+        prefetch_node(*v);
+        if (const leda::node* w = nodes.lookup(step.called))
+          edgeIndex->prefetch(*v, *w);
+      }
+    }
+    break;
+  default:
+    if (step.callingNode)
+      prefetch_out_end(step.callingNode);
+    break;
+  }
+}
+
+void KvCGenericFunctionCallGraph::enterEdge(const Step& step) {
+  // addCall once both infos are known.
+  leda::edge e = nullptr;
+  addEdge(step.calling, step.called, e);
+  synchronizeEdgeInfoAtConstruction(inf(e), step.call);
+  step.called->addCallOperation(step.call);
+  if (!step.selfCall)
+    step.calling->addCalledFcn(step.called);
 }
 
 void KvCGenericFunctionCallGraph::treatFcnSymbolByUses(KvCParamSymbol* function) {

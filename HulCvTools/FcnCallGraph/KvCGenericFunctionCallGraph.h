@@ -120,6 +120,32 @@ private:
   void treatFcnSymbols(const std::vector<KvCParamSymbol*>& functions);
   // Enters the call of which `use` is an operand, if any.
   void enterUse(KV_ExprLocation* use);
+
+  // Construction runs in two passes over the uses: the first reads the model and records
+  // what each use asks for, the second carries the records out in order, fetching the
+  // graph memory of the records a few places ahead into the cache meanwhile.
+  struct Step {
+    enum Kind : unsigned char {
+      kNode,       // register `calling` (the info of `function`) and synchronize it
+      kIncomplete, // a use without operation
+      kEdge,       // enter `call` from `calling` to `called`, both known
+      kCall        // enter `call` through addCall (it has an end missing)
+    };
+    Kind kind;
+    bool selfCall;
+    KvCFcgFunctionInfo* calling;
+    KvCFcgFunctionInfo* called;
+    KvCParamSymbol* function;
+    KvCCallOperation* call;
+    leda::node callingNode; // known to the second pass a few records ahead, or null
+  };
+  // Records what `use` asks for.
+  void recordUse(KV_ExprLocation* use);
+  // Carries out the recorded steps in order and forgets them.
+  void replaySteps();
+  void prefetchStep(std::size_t i, int stage);
+  void enterEdge(const Step& step);
+
   // The function's node, registered when missing (one map lookup).
   leda::node nodeOf(KvCFcgFunctionInfo* function);
   bool isEnteredOutsideFunctions(KvCCallOperation* call) const;
@@ -131,6 +157,7 @@ private:
   std::unique_ptr<KvCFcgEdgeIndex> edgeIndex;
   // Reused by construction for the uses of one symbol at a time.
   std::vector<KV_ExprLocation*> useBuffer;
+  std::vector<Step> steps;
 };
 
 #endif

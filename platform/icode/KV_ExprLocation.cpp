@@ -2,9 +2,9 @@
 
 #include "platform/icode/KV_Constant.h"
 #include "platform/icode/KV_DataType.h"
-#include "platform/icode/KV_Range.h"
 #include "platform/icode/KV_Operation.h"
 #include "platform/icode/KV_QualifiedSymbolOp.h"
+#include "platform/icode/KV_Range.h"
 #include "platform/icode/KV_Statement.h"
 #include "platform/icode/KvCExprLocDB.h"
 #include "platform/icode/KvCSmbInitValExpr.h"
@@ -81,6 +81,7 @@ KV_Statement* KV_ExprLocation::getStatement() const {
 }
 
 void KV_ExprLocation::dropContent() {
+  noteStructureChange();
   if (expression) {
     expression->parentLocation = nullptr;
     if (KvCSmbInitValExpr* init = expression->asSmbInitValExpr())

@@ -100,6 +100,7 @@ private:
   };
 
   void attach(KV_ICodeElem* newParent, int index) {
+    noteStructureChange();
     parent = newParent;
     indexInParent = index;
   }

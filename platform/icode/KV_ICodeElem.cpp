@@ -3,7 +3,9 @@
 #include "platform/icode/KV_ExprLocation.h"
 #include "platform/icode/KvCIcExpression.h"
 
-KV_ICodeElem::~KV_ICodeElem() = default;
+std::uint64_t KV_ICodeElem::s_structureEpoch = 1;
+
+KV_ICodeElem::~KV_ICodeElem() { noteStructureChange(); }
 
 bool KV_ICodeElem::isWithin(const KV_ICodeElem* ancestor) const {
   for (const KV_ICodeElem* e = this; e; e = e->getParentElem())

@@ -7,10 +7,18 @@
 // symbol, the call operations of a function) are ordered by it.
 //
 // Elements are owned by the code view data that created them; nobody else frees them.
+//
+// Structure epoch: one process-wide counter that every change of how elements are linked
+// bumps (operands, statement roots, a location's content, tables and statements attached,
+// a table's code block symbol, initial value elements, an element destroyed). Answers
+// derived by walking up the tree may be cached together with the epoch they were found
+// at and reused while it is unchanged. The model is not thread-safe, nor is the counter.
 #ifndef HUL_PLATFORM_ICODE_KV_ICODEELEM_H
 #define HUL_PLATFORM_ICODE_KV_ICODEELEM_H
 
 #include "platform/support/HulPlatformExport.h"
+
+#include <cstdint>
 
 class KV_ExprLocation;
 class KV_Operation;
@@ -40,11 +48,16 @@ public:
   // Whether `ancestor` is this element or lies above it. O(depth).
   bool isWithin(const KV_ICodeElem* ancestor) const;
 
+  // The current structure epoch (never 0) and its bump; see the file comment.
+  static std::uint64_t structureEpoch() { return s_structureEpoch; }
+  static void noteStructureChange() { ++s_structureEpoch; }
+
 protected:
   explicit KV_ICodeElem(int serialNumber) : serial(serialNumber) {}
 
 private:
   int serial;
+  static std::uint64_t s_structureEpoch;
 };
 
 #endif

@@ -25,8 +25,7 @@ public:
   static void makeNegativeWithZeroConsiderScaling(KV_Range& range, const KV_NumericalType* type,
                                                   const KV_Scaling* scaling);
   // upper <= the largest representable value < 0.
-  static void makeNegativeWithoutZeroConsiderScaling(KV_Range& range,
-                                                     const KV_NumericalType* type,
+  static void makeNegativeWithoutZeroConsiderScaling(KV_Range& range, const KV_NumericalType* type,
                                                      const KV_Scaling* scaling);
   // upper = min(upper, limit) / lower = max(lower, limit), in the range's own kind
   // (an integer range takes the integer limits, a float range the double limits).

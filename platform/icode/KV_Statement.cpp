@@ -10,6 +10,7 @@ bool KV_Statement::setExprLoc(KV_ExprLocation* loc) {
     return true;
   if (loc && loc->getParent())
     return false;
+  noteStructureChange();
   if (root)
     root->detach();
   root = loc;
@@ -31,6 +32,7 @@ KV_StatementTable* KV_Statement::getStatementTable(int i) const {
 bool KV_Statement::addStatementTable(KV_StatementTable* table) {
   if (!table || table->parentStatement || isWithin(table))
     return false;
+  noteStructureChange();
   table->parentStatement = this;
   tables.push_back(table);
   return true;
@@ -45,6 +47,7 @@ KV_Statement* KV_StatementTable::getStatement(int i) const {
 bool KV_StatementTable::appendStatement(KV_Statement* statement) {
   if (!statement || statement->parentTable || isWithin(statement))
     return false;
+  noteStructureChange();
   statement->parentTable = this;
   statements.push_back(statement);
   return true;

@@ -19,7 +19,10 @@ public:
 
   // Own or inherited; null outside every function. O(nesting depth).
   KvCParamSymbol* getCodeBlockSymbol() const;
-  void setCodeBlockSymbol(KvCParamSymbol* symbol) { codeBlockSymbol = symbol; }
+  void setCodeBlockSymbol(KvCParamSymbol* symbol) {
+    noteStructureChange();
+    codeBlockSymbol = symbol;
+  }
   KvCIcFileId* getFile() const;
   void setFile(KvCIcFileId* file) { fileId = file; }
   // The names declared in this table's scope, or null when it has no scope of its own.

@@ -6,8 +6,10 @@
 KvCCallOperation::KvCCallOperation(int serialNumber, KvCParamSymbol* called)
     : KV_Operation(serialNumber, KV_OpOperator::get(KV_OP_CALL)), calledSymbol(called) {}
 
-KvCParamSymbol* KvCCallOperation::getCallingSymbol() const {
+KvCParamSymbol* KvCCallOperation::findCallingSymbol() const {
   KV_Statement* statement = findParentStatement();
   KvCCStmTable* table = statement ? statement->getParentCTable() : nullptr;
-  return table ? table->getCodeBlockSymbol() : nullptr;
+  callingSymbol = table ? table->getCodeBlockSymbol() : nullptr;
+  callingEpoch = structureEpoch();
+  return callingSymbol;
 }

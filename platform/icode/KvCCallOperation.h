@@ -4,11 +4,14 @@
 //
 // The calling function is not stored: it is the code block symbol of the statement table
 // that contains the call, found on demand (null for a call outside every function, for
-// example in an initial value at file level).
+// example in an initial value at file level). The answer is kept with the structure
+// epoch it was found at (see KV_ICodeElem) and reused while no link of the ICode changed.
 #ifndef HUL_PLATFORM_ICODE_KVCCALLOPERATION_H
 #define HUL_PLATFORM_ICODE_KVCCALLOPERATION_H
 
 #include "platform/icode/KV_Operation.h"
+
+#include <cstdint>
 
 class KvCParamSymbol;
 class KvCTaskActivation;
@@ -20,8 +23,15 @@ public:
   KvCCallOperation* asCallOperation() override { return this; }
 
   KvCParamSymbol* getCalledSymbol() const { return calledSymbol; }
-  // The function or macro whose body holds the call, or null. O(depth).
-  KvCParamSymbol* getCallingSymbol() const;
+  // The function or macro whose body holds the call, or null. O(1) while the ICode's
+  // structure is unchanged since the last call, else O(depth).
+  KvCParamSymbol* getCallingSymbol() const {
+    if (callingEpoch == structureEpoch())
+      return callingSymbol;
+    return findCallingSymbol();
+  }
+  // Whether getCallingSymbol answers without walking.
+  bool isCallingSymbolKnown() const { return callingEpoch == structureEpoch(); }
 
   // The descriptor when the call activates a task, else null. Not owned.
   KvCTaskActivation* getTaskActivation() const { return taskActivation; }
@@ -31,6 +41,11 @@ public:
 private:
   KvCParamSymbol* calledSymbol;
   KvCTaskActivation* taskActivation = nullptr;
+
+  // Walks up to the calling function and caches it.
+  KvCParamSymbol* findCallingSymbol() const;
+  mutable KvCParamSymbol* callingSymbol = nullptr;
+  mutable std::uint64_t callingEpoch = 0; // 0: nothing cached
 };
 
 #endif

@@ -36,6 +36,7 @@ bool KvCSmbInitValExpr::addElement(KvCIcExpression* element) {
   // Its parent would be the holder: refused when the holder lies within it.
   if (getParent() && getParent()->isWithin(element))
     return false;
+  noteStructureChange();
   elements.push_back(element);
   element->containingInitValue = this;
   element->parentLocation = getParent();
@@ -43,6 +44,7 @@ bool KvCSmbInitValExpr::addElement(KvCIcExpression* element) {
 }
 
 void KvCSmbInitValExpr::setElementsParent(KV_ExprLocation* holder) {
+  noteStructureChange();
   for (KvCIcExpression* e : elements)
     e->parentLocation = holder;
 }

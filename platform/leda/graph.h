@@ -325,6 +325,13 @@ public:
   }
 
   bool is_hidden(edge e) const { return e->hidden(); }
+  // Cache hints for a new edge out of v to come: v's record, then (once that is cached)
+  // v's last outgoing edge, which the new edge is linked after.
+  static void prefetch_node(node v) { __builtin_prefetch(v, 1); }
+  static void prefetch_out_end(node v) {
+    if (v->outLast)
+      __builtin_prefetch(v->outLast, 1);
+  }
 
   void restore_edge(edge e) {
     assert(e);

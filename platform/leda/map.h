@@ -119,6 +119,29 @@ public:
   }
 
   bool defined(const K& k) const { return findSlot(k, hashOf(k)) != kNoSlot; }
+  // The value of k, or null when k is undefined; never defines.
+  const V* lookup(const K& k) const {
+    const std::size_t found = findSlot(k, hashOf(k));
+    return found == kNoSlot ? nullptr : &entryAt(slots_[found].entry).kv->second;
+  }
+
+  // Cache hints for a lookup of k to come: its home slot, then (once the slots are
+  // cached) the first entry whose hash matches. Neither reads an entry.
+  void prefetch_slot(const K& k) const {
+    if (!slots_.empty())
+      __builtin_prefetch(&slots_[hashOf(k) & mask()]);
+  }
+  void prefetch_entry(const K& k) const {
+    if (slots_.empty())
+      return;
+    const std::size_t h = hashOf(k);
+    for (std::size_t i = h & mask(); slots_[i].entry != kNone; i = (i + 1) & mask()) {
+      if (slots_[i].hash == h) {
+        __builtin_prefetch(&entryAt(slots_[i].entry));
+        return;
+      }
+    }
+  }
 
   // Returns false if k was not defined.
   bool undefine(const K& k) {

@@ -29,19 +29,20 @@ public:
 
   set() = default;
   explicit set(detail::CompareFn<T> cmp) : items_(detail::FnLess<T>{cmp}) {}
-  set(const set& other) : items_(other.items_) {}
+  set(const set& other) : items_(other.items_) { resetMarks(); }
   set(set&& other) noexcept : items_(std::move(other.items_)) {
-    other.finger_ = other.items_.end();
+    resetMarks();
+    other.resetMarks();
   }
   set& operator=(const set& other) {
     items_ = other.items_;
-    finger_ = items_.end();
+    resetMarks();
     return *this;
   }
   set& operator=(set&& other) noexcept {
     items_ = std::move(other.items_);
-    finger_ = items_.end();
-    other.finger_ = other.items_.end();
+    resetMarks();
+    other.resetMarks();
     return *this;
   }
 
@@ -52,8 +53,8 @@ public:
   bool insert(const T& x) {
     const detail::FnLess<T>& less = items_.key_comp();
     if (finger_ != items_.end()) {
-      // The last element is known in O(1); stepping past it would climb the tree.
-      const bool atLast = finger_ == std::prev(items_.end());
+      // The last element is remembered; stepping past it would climb the tree.
+      const bool atLast = finger_ == last_;
       auto after = atLast ? items_.end() : std::next(finger_);
       if (after != items_.end() && !less(*after, x) && !less(x, *after)) {
         finger_ = after; // present already, right after the last one
@@ -61,12 +62,28 @@ public:
       }
       if (less(*finger_, x) && (after == items_.end() || less(x, *after))) {
         finger_ = items_.insert(after, x);
+        if (atLast)
+          last_ = finger_;
         return true;
       }
     }
     const std::size_t before = items_.size();
     finger_ = items_.insert(items_.end(), x);
-    return items_.size() != before;
+    if (items_.size() == before)
+      return false;
+    if (last_ == items_.end() || less(*last_, x))
+      last_ = finger_;
+    return true;
+  }
+  // Cache hint for an insertion to come: the element the last insertion ended at.
+  void prefetch_finger() const {
+    if (finger_ != items_.end())
+      __builtin_prefetch(&*finger_);
+  }
+  // The next hint, once the finger's element is cached: the element after it.
+  void prefetch_after_finger() const {
+    if (finger_ != items_.end() && finger_ != last_)
+      __builtin_prefetch(&*std::next(finger_));
   }
   // Returns false if no equal element was present.
   bool del(const T& x) {
@@ -75,6 +92,8 @@ public:
       return false;
     if (it == finger_)
       finger_ = items_.end();
+    if (it == last_)
+      last_ = it == items_.begin() ? items_.end() : std::prev(it);
     items_.erase(it);
     return true;
   }
@@ -87,7 +106,7 @@ public:
   bool empty() const { return items_.empty(); }
   void clear() {
     items_.clear();
-    finger_ = items_.end();
+    resetMarks();
   }
 
   const T& min() const {
@@ -123,12 +142,20 @@ private:
       if (other.member(x) == keepMembers)
         result.items_.insert(result.items_.end(), x);
     }
+    result.resetMarks();
     return result;
+  }
+
+  void resetMarks() {
+    finger_ = items_.end();
+    last_ = items_.empty() ? items_.end() : std::prev(items_.end());
   }
 
   Tree items_;
   // Where the last insertion ended, or end(); reset by whatever could invalidate it.
   typename Tree::iterator finger_ = items_.end();
+  // The greatest element, or end() for the empty set.
+  typename Tree::iterator last_ = items_.end();
 };
 
 } // namespace leda
