@@ -10,6 +10,8 @@
 #include "platform/support/FPS.h"
 #include "platform/support/KvCMessageServer.h"
 
+#include "tests/Control/MessageServerFixture.h"
+
 #include <gtest/gtest.h>
 
 #include <cfloat>
@@ -94,21 +96,8 @@ std::vector<double> constantGrid() {
   return grid;
 }
 
-class ConstInRelationRounderTest : public ::testing::Test {
+class ConstInRelationRounderTest : public MessageServerFixture {
 protected:
-  void SetUp() override { resetServer(); }
-  void TearDown() override { resetServer(); }
-  static void resetServer() {
-    server().clear();
-    server().setShowInternalInfo(false);
-  }
-  static KvCMessageServer& server() { return *KvCMessageServer::getMessageServer(); }
-  static std::vector<std::string> reports() {
-    std::vector<std::string> expressions;
-    for (const KvCDebugAssertionRecord& r : server().getDebugAssertions())
-      expressions.push_back(r.expression.str());
-    return expressions;
-  }
   // One debug report "0" per rejection, in builds with debug checks.
   static std::vector<std::string> rejections(std::size_t n) {
     return std::vector<std::string>(KvCInternalCheck::hasDebugChecks() ? n : 0, "0");

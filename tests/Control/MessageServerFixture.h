@@ -6,6 +6,9 @@
 
 #include <gtest/gtest.h>
 
+#include <string>
+#include <vector>
+
 class MessageServerFixture : public ::testing::Test {
 protected:
   void SetUp() override { reset(); }
@@ -13,6 +16,13 @@ protected:
 
   static KvCMessageServer& server() { return *KvCMessageServer::getMessageServer(); }
   static const std::vector<KvCMessageRecord>& messages() { return server().getMessages(); }
+  // The expressions of the debug assertion reports, in order.
+  static std::vector<std::string> reports() {
+    std::vector<std::string> expressions;
+    for (const KvCDebugAssertionRecord& r : server().getDebugAssertions())
+      expressions.push_back(r.expression.str());
+    return expressions;
+  }
 
 private:
   static void reset() {

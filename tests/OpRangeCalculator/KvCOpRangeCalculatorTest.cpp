@@ -12,6 +12,8 @@
 #include "platform/icode/KV_Range.h"
 #include "platform/support/KvCMessageServer.h"
 
+#include "tests/Control/MessageServerFixture.h"
+
 #include <gtest/gtest.h>
 
 #include <array>
@@ -36,22 +38,8 @@ using Ints = std::array<std::int64_t, 2>;
 using Doubles = std::array<double, 2>;
 using Flags = std::array<bool, 4>;
 
-class OpRangeCalculatorTest : public ::testing::Test {
+class OpRangeCalculatorTest : public MessageServerFixture {
 protected:
-  void SetUp() override { resetServer(); }
-  void TearDown() override { resetServer(); }
-  static void resetServer() {
-    server().clear();
-    server().setShowInternalInfo(false);
-  }
-  static KvCMessageServer& server() { return *KvCMessageServer::getMessageServer(); }
-  static std::vector<std::string> reports() {
-    std::vector<std::string> expressions;
-    for (const KvCDebugAssertionRecord& r : server().getDebugAssertions())
-      expressions.push_back(r.expression.str());
-    return expressions;
-  }
-
   KV_NumericalType* numerical(KV_DataType* type) { return type->asNumericalType(); }
   // x + 1 with conversion information and the given result range.
   KV_ExprLocation* calculation(bool calculateProtected, const KV_Range& resultRange) {
