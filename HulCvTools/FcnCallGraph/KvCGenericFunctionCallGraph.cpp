@@ -272,6 +272,7 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
     listed = collector.visited;
     treatFcnSymbols(functions);
   }
+  addDeferredCalledFcns();
   return !incomplete;
 }
 
@@ -280,11 +281,16 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
   useBuffer.clear();
   std::vector<std::size_t> starts;
   starts.reserve(functions.size() + 1);
-  std::vector<KV_ExprLocation*> uses;
-  for (KvCParamSymbol* function : functions) {
+  const std::size_t count = functions.size();
+  for (std::size_t f = 0; f < count; ++f) {
+    // The symbols lie scattered; their databases are fetched a few symbols ahead.
+    if (f + 16 < count)
+      functions[f + 16]->getExprLocDB()->prefetchUseRecords();
+    if (f + 8 < count)
+      functions[f + 8]->getExprLocDB()->prefetchUses();
     starts.push_back(useBuffer.size());
-    function->getExprLocDB()->listUses(uses);
-    useBuffer.insert(useBuffer.end(), uses.begin(), uses.end());
+    functions[f]->getExprLocDB()->listUses(listedUses);
+    useBuffer.insert(useBuffer.end(), listedUses.begin(), listedUses.end());
   }
   starts.push_back(useBuffer.size());
 
@@ -293,12 +299,14 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
   steps.clear();
   KvCUsePrefetcher prefetcher;
   std::size_t prefetched = 0;
-  for (std::size_t f = 0; f < functions.size(); ++f) {
+  for (std::size_t f = 0; f < count; ++f) {
+    if (f + 8 < count)
+      prefetch(functions[f + 8]);
     KvCParamSymbol* function = functions[f];
     KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
     if (!info)
       continue;
-    steps.push_back(Step{Step::kNode, false, info, nullptr, function, nullptr, nullptr});
+    steps.push_back(Step{Step::kNode, false, info, nullptr, function, nullptr, nullptr, nullptr});
     for (std::size_t u = starts[f]; u < starts[f + 1]; ++u) {
       if (u == prefetched) {
         const std::size_t n = std::min(KvCUsePrefetcher::kGroup, useBuffer.size() - u);
@@ -317,7 +325,7 @@ void KvCGenericFunctionCallGraph::recordUse(KV_ExprLocation* use) {
   // As enterUse and addCall decide, without changing the graph.
   KV_Operation* op = use->getOperation();
   if (!op) {
-    steps.push_back(Step{Step::kIncomplete, false, nullptr, nullptr, nullptr, nullptr, nullptr});
+    steps.push_back(Step{Step::kIncomplete, false, nullptr, nullptr, nullptr, nullptr, nullptr, nullptr});
     return;
   }
   KV_Operation* above = op->getParentOperation();
@@ -331,25 +339,41 @@ void KvCGenericFunctionCallGraph::recordUse(KV_ExprLocation* use) {
   KvCFcgFunctionInfo* calledInfo = bothEnds ? provideFcgNodeInfo(called) : nullptr;
   if (callingInfo && calledInfo)
     steps.push_back(
-        Step{Step::kEdge, calling == called, callingInfo, calledInfo, nullptr, call, nullptr});
+        Step{Step::kEdge, calling == called, callingInfo, calledInfo, nullptr, call, nullptr, nullptr});
   else
-    steps.push_back(Step{Step::kCall, false, nullptr, nullptr, nullptr, call, nullptr});
+    steps.push_back(Step{Step::kCall, false, nullptr, nullptr, nullptr, call, nullptr, nullptr});
 }
 
 void KvCGenericFunctionCallGraph::replaySteps() {
-  // Each record's graph memory is fetched in stages, a stage reading only what the
-  // previous one brought in: kAhead[s] records ahead of the one carried out.
-  constexpr std::size_t kAhead[] = {12, 8, 4, 2};
+  // Two passes over the batch, each with its own prefetch distances: first the nodes
+  // (registered in the order addEdge would register them, node hooks in order), then the
+  // edges and calls in order. A pass reads, kFar records ahead, what the record needs
+  // first and, kNear records ahead, what that brought in points to.
+  constexpr std::size_t kFar = 16;
+  constexpr std::size_t kNear = 8;
   const std::size_t n = steps.size();
   for (std::size_t i = 0; i < n; ++i) {
-    for (int s = 0; s < 4; ++s)
-      if (i + kAhead[s] < n)
-        prefetchStep(i + kAhead[s], s);
+    if (i + kFar < n)
+      prefetchNodes(steps[i + kFar], false);
+    if (i + kNear < n)
+      prefetchNodes(steps[i + kNear], true);
+    Step& step = steps[i];
+    if (step.kind == Step::kNode) {
+      registerNode(step.calling);
+      synchronizeNodeInfoAtConstruction(step.calling, step.function);
+    } else if (step.kind == Step::kEdge) {
+      step.v = nodeOf(step.calling);
+      step.w = nodeOf(step.called);
+    }
+  }
+  for (std::size_t i = 0; i < n; ++i) {
+    if (i + kFar < n)
+      prefetchEdge(steps[i + kFar], false);
+    if (i + kNear < n)
+      prefetchEdge(steps[i + kNear], true);
     const Step& step = steps[i];
     switch (step.kind) {
     case Step::kNode:
-      registerNode(step.calling);
-      synchronizeNodeInfoAtConstruction(step.calling, step.function);
       break;
     case Step::kIncomplete:
       incomplete = true;
@@ -365,46 +389,74 @@ void KvCGenericFunctionCallGraph::replaySteps() {
   steps.clear();
 }
 
-void KvCGenericFunctionCallGraph::prefetchStep(std::size_t i, int stage) {
-  Step& step = steps[i];
+void KvCGenericFunctionCallGraph::prefetchNodes(const Step& step, bool near) const {
+  if (step.kind != Step::kNode && step.kind != Step::kEdge)
+    return;
+  if (!near) {
+    nodes.prefetch_slot(step.calling);
+    if (step.kind == Step::kEdge)
+      nodes.prefetch_slot(step.called);
+    else
+      prefetch(step.calling); // for the node hook
+    return;
+  }
+  nodes.prefetch_entry(step.calling);
+  if (step.kind == Step::kEdge)
+    nodes.prefetch_entry(step.called);
+}
+
+void KvCGenericFunctionCallGraph::prefetchEdge(const Step& step, bool near) const {
   if (step.kind != Step::kEdge)
     return;
-  switch (stage) {
-  case 0:
-    nodes.prefetch_slot(step.calling);
-    prefetch(step.calling);
+  if (!near) {
+    edgeIndex->prefetch(step.v, step.w);
+    prefetch_node(step.v);
+    prefetch_node(step.w);
+    prefetch(step.called);
     prefetch(step.call);
-    break;
-  case 1:
-    nodes.prefetch_entry(step.calling);
-    step.calling->getCalledFunctionsSet().prefetch_finger();
-    break;
-  case 2:
-    step.calling->getCalledFunctionsSet().prefetch_after_finger();
-    if (const leda::node* v = nodes.lookup(step.calling)) {
-      step.callingNode = *v;
-      if (*v) {
-        prefetch_node(*v);
-        if (const leda::node* w = nodes.lookup(step.called))
-          edgeIndex->prefetch(*v, *w);
-      }
-    }
-    break;
-  default:
-    if (step.callingNode)
-      prefetch_out_end(step.callingNode);
-    break;
+    return;
   }
+  prefetch_out_end(step.v);
+  step.called->getCallOperationsSet().prefetch();
 }
 
 void KvCGenericFunctionCallGraph::enterEdge(const Step& step) {
   // addCall once both infos are known.
   leda::edge e = nullptr;
-  addEdge(step.calling, step.called, e);
+  addEdgeBetween(step.v, step.w, e);
   synchronizeEdgeInfoAtConstruction(inf(e), step.call);
   step.called->addCallOperation(step.call);
-  if (!step.selfCall)
-    step.calling->addCalledFcn(step.called);
+  if (!step.selfCall) {
+    const KvCFcgCalledFunction called = step.called->asCalledFunction();
+    deferredCalled.push_back(
+        DeferredCalled{index(step.v), called.debugIndex, step.calling, called.symbol});
+  }
+}
+
+void KvCGenericFunctionCallGraph::addDeferredCalledFcns() {
+  // A counting sort by calling node keeps each calling function's entries in the order
+  // they were met; every set is then loaded once.
+  const std::size_t buckets = static_cast<std::size_t>(max_node_index()) + 2;
+  std::vector<std::size_t> start(buckets + 1, 0);
+  for (const DeferredCalled& d : deferredCalled)
+    ++start[static_cast<std::size_t>(d.callingNode) + 1];
+  for (std::size_t b = 1; b <= buckets; ++b)
+    start[b] += start[b - 1];
+  deferredByCaller.resize(deferredCalled.size());
+  for (const DeferredCalled& d : deferredCalled)
+    deferredByCaller[start[static_cast<std::size_t>(d.callingNode)]++] = d;
+  deferredCalled.clear();
+  constexpr std::size_t kAhead = 8;
+  const std::size_t n = deferredByCaller.size();
+  for (std::size_t i = 0; i < n; ++i) {
+    if (i + kAhead < n)
+      prefetch(deferredByCaller[i + kAhead].calling);
+    if (i + kAhead / 2 < n)
+      deferredByCaller[i + kAhead / 2].calling->getCalledFunctionsSet().prefetch();
+    const DeferredCalled& d = deferredByCaller[i];
+    d.calling->addCalledFcn(KvCFcgCalledFunction{d.calledDebugIndex, d.calledSymbol});
+  }
+  deferredByCaller.clear();
 }
 
 void KvCGenericFunctionCallGraph::treatFcnSymbolByUses(KvCParamSymbol* function) {
@@ -498,6 +550,10 @@ bool KvCGenericFunctionCallGraph::addEdge(KvCFcgFunctionInfo* calling, KvCFcgFun
                                           leda::edge& e) {
   const leda::node v = nodeOf(calling);
   const leda::node w = nodeOf(called);
+  return addEdgeBetween(v, w, e);
+}
+
+bool KvCGenericFunctionCallGraph::addEdgeBetween(leda::node v, leda::node w, leda::edge& e) {
   if (leda::edge existing = edgeIndex->find(v, w)) {
     e = existing;
     if (KvCFcgEdgeInfo* info = inf(e))

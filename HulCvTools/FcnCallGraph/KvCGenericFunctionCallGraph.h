@@ -137,14 +137,20 @@ private:
     KvCFcgFunctionInfo* called;
     KvCParamSymbol* function;
     KvCCallOperation* call;
-    leda::node callingNode; // known to the second pass a few records ahead, or null
+    leda::node v; // the calling and called node of a kEdge record, once registered
+    leda::node w;
   };
   // Records what `use` asks for.
   void recordUse(KV_ExprLocation* use);
   // Carries out the recorded steps in order and forgets them.
   void replaySteps();
-  void prefetchStep(std::size_t i, int stage);
+  void prefetchNodes(const Step& step, bool near) const;
+  void prefetchEdge(const Step& step, bool near) const;
+  // addEdge between registered nodes.
+  bool addEdgeBetween(leda::node v, leda::node w, leda::edge& e);
   void enterEdge(const Step& step);
+  // Adds the called functions that construction deferred, grouped by calling function.
+  void addDeferredCalledFcns();
 
   // The function's node, registered when missing (one map lookup).
   leda::node nodeOf(KvCFcgFunctionInfo* function);
@@ -157,7 +163,19 @@ private:
   std::unique_ptr<KvCFcgEdgeIndex> edgeIndex;
   // Reused by construction for the uses of one symbol at a time.
   std::vector<KV_ExprLocation*> useBuffer;
+  std::vector<KV_ExprLocation*> listedUses;
   std::vector<Step> steps;
+  // Called functions still to be added to their calling function's set: construction adds
+  // them calling function by calling function, which loads each set once instead of once
+  // per call.
+  struct DeferredCalled {
+    int callingNode;       // index of the calling node
+    int calledDebugIndex;  // with calledSymbol, the called function as its set keeps it
+    KvCFcgFunctionInfo* calling;
+    KvCParamSymbol* calledSymbol;
+  };
+  std::vector<DeferredCalled> deferredCalled;
+  std::vector<DeferredCalled> deferredByCaller;
 };
 
 #endif

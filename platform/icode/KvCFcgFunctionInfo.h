@@ -7,7 +7,7 @@
 #ifndef HUL_PLATFORM_ICODE_KVCFCGFUNCTIONINFO_H
 #define HUL_PLATFORM_ICODE_KVCFCGFUNCTIONINFO_H
 
-#include "platform/leda/set.h"
+#include "platform/icode/KvCFcgSortedSet.h"
 #include "platform/support/HulPlatformExport.h"
 
 class KvCCallOperation;
@@ -21,18 +21,37 @@ struct KvCFcgCalledFunction {
   KvCParamSymbol* symbol;
 };
 
+// The orders of the two sets: call operations by serial number, called functions by debug
+// index.
+struct HUL_PLATFORM_API KvCFcgCallsBySerial {
+  bool operator()(const KvCCallOperation* a, const KvCCallOperation* b) const;
+};
+struct KvCFcgCalledByDebugIndex {
+  bool operator()(const KvCFcgCalledFunction& a, const KvCFcgCalledFunction& b) const {
+    return a.debugIndex < b.debugIndex;
+  }
+};
+
 class HUL_PLATFORM_API KvCFcgFunctionInfo {
 public:
   explicit KvCFcgFunctionInfo(KvCParamSymbol* owner);
 
   KvCParamSymbol* getSymbol() const { return symbol; }
 
-  leda::set<KvCCallOperation*>& getCallOperationsSet() { return callOperations; }
-  leda::set<KvCFcgCalledFunction>& getCalledFunctionsSet() { return calledFunctions; }
+  using CallOperationSet = KvCFcgSortedSet<KvCCallOperation*, KvCFcgCallsBySerial>;
+  using CalledFunctionSet = KvCFcgSortedSet<KvCFcgCalledFunction, KvCFcgCalledByDebugIndex>;
+
+  CallOperationSet& getCallOperationsSet() { return callOperations; }
+  CalledFunctionSet& getCalledFunctionsSet() { return calledFunctions; }
   // Each answers whether the set changed.
-  bool addCallOperation(KvCCallOperation* call) { return call && callOperations.insert(call); }
-  bool delCallOperation(KvCCallOperation* call) { return call && callOperations.del(call); }
+  bool addCallOperation(KvCCallOperation* call);
+  bool delCallOperation(KvCCallOperation* call);
   bool addCalledFcn(KvCFcgFunctionInfo* called);
+  // The same for a called function already in its set form (see asCalledFunction); a null
+  // symbol changes nothing.
+  bool addCalledFcn(const KvCFcgCalledFunction& called);
+  // This function as an element of a set of called functions.
+  KvCFcgCalledFunction asCalledFunction() const;
 
   bool isInLoop() const { return inLoop; }
   void markInLoop() { inLoop = true; }
@@ -49,8 +68,8 @@ public:
 
 private:
   KvCParamSymbol* symbol;
-  leda::set<KvCCallOperation*> callOperations;
-  leda::set<KvCFcgCalledFunction> calledFunctions;
+  CallOperationSet callOperations;
+  CalledFunctionSet calledFunctions;
   bool inLoop = false;
   bool inlined = false;
   bool removed = false;

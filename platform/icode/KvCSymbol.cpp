@@ -24,25 +24,29 @@ KvCParamSymbol::KvCParamSymbol(int index, WmCXString symbolName, KV_DataType* re
 
 KvCParamSymbol::~KvCParamSymbol() = default;
 
-namespace {
-int compareCallsBySerial(KvCCallOperation* const& a, KvCCallOperation* const& b) {
-  const int x = a ? a->getSerial() : -1;
-  const int y = b ? b->getSerial() : -1;
-  return x < y ? -1 : (x > y ? 1 : 0);
+bool KvCFcgCallsBySerial::operator()(const KvCCallOperation* a,
+                                     const KvCCallOperation* b) const {
+  return (a ? a->getSerial() : -1) < (b ? b->getSerial() : -1);
 }
 
-int compareFunctionsByDebugIndex(const KvCFcgCalledFunction& a, const KvCFcgCalledFunction& b) {
-  return a.debugIndex < b.debugIndex ? -1 : (a.debugIndex > b.debugIndex ? 1 : 0);
-}
-} // namespace
+KvCFcgFunctionInfo::KvCFcgFunctionInfo(KvCParamSymbol* owner) : symbol(owner) {}
 
-KvCFcgFunctionInfo::KvCFcgFunctionInfo(KvCParamSymbol* owner)
-    : symbol(owner), callOperations(&compareCallsBySerial),
-      calledFunctions(&compareFunctionsByDebugIndex) {}
+bool KvCFcgFunctionInfo::addCallOperation(KvCCallOperation* call) {
+  return call && callOperations.insert(call);
+}
+
+bool KvCFcgFunctionInfo::delCallOperation(KvCCallOperation* call) {
+  return call && callOperations.del(call);
+}
 
 bool KvCFcgFunctionInfo::addCalledFcn(KvCFcgFunctionInfo* called) {
-  if (!called || !called->symbol)
-    return false;
-  return calledFunctions.insert(
-      KvCFcgCalledFunction{called->symbol->getDebugIndex(), called->symbol});
+  return called && addCalledFcn(called->asCalledFunction());
+}
+
+bool KvCFcgFunctionInfo::addCalledFcn(const KvCFcgCalledFunction& called) {
+  return called.symbol && calledFunctions.insert(called);
+}
+
+KvCFcgCalledFunction KvCFcgFunctionInfo::asCalledFunction() const {
+  return KvCFcgCalledFunction{symbol ? symbol->getDebugIndex() : 0, symbol};
 }

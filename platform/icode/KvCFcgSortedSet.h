@@ -1,0 +1,166 @@
+// KvCFcgSortedSet<T, Less>: the ordered set a function's call-graph record keeps its call
+// operations and its called functions in.
+//
+// Most such sets are small (a function is called a few times and calls a few functions)
+// and are filled in ascending order, cleared and filled again each time a call graph is
+// constructed. So the set keeps its elements in one sorted array while it is small: an
+// insertion at the end is O(1), a lookup is one binary search in contiguous memory, and
+// clear() keeps the array's capacity, so refilling allocates nothing. Once a set grows past
+// kFlatLimit elements it moves into a balanced tree (O(log n) for every update, whatever
+// the order) and stays there until it is cleared; large sets never pay O(n) per update.
+//
+// Elements are ordered by `Less` (a stateless strict weak order); two elements are the same
+// member iff neither is less than the other, and inserting such an element keeps the stored
+// one. Iteration is in ascending order. Any insertion or deletion invalidates iterators.
+#ifndef HUL_PLATFORM_ICODE_KVCFCGSORTEDSET_H
+#define HUL_PLATFORM_ICODE_KVCFCGSORTEDSET_H
+
+#include <algorithm>
+#include <cstddef>
+#include <iterator>
+#include <set>
+#include <vector>
+
+template <class T, class Less> class KvCFcgSortedSet {
+  using Tree = std::set<T, Less>;
+
+public:
+  static constexpr std::size_t kFlatLimit = 128;
+
+  class const_iterator {
+  public:
+    using iterator_category = std::forward_iterator_tag;
+    using value_type = T;
+    using difference_type = std::ptrdiff_t;
+    using pointer = const T*;
+    using reference = const T&;
+
+    const_iterator() = default;
+    reference operator*() const { return flat ? *p : *it; }
+    pointer operator->() const { return &**this; }
+    const_iterator& operator++() {
+      if (flat)
+        ++p;
+      else
+        ++it;
+      return *this;
+    }
+    const_iterator operator++(int) {
+      const_iterator old = *this;
+      ++*this;
+      return old;
+    }
+    friend bool operator==(const const_iterator& a, const const_iterator& b) {
+      return a.flat ? a.p == b.p : a.it == b.it;
+    }
+    friend bool operator!=(const const_iterator& a, const const_iterator& b) { return !(a == b); }
+
+  private:
+    friend class KvCFcgSortedSet;
+    explicit const_iterator(const T* q) : p(q), flat(true) {}
+    explicit const_iterator(typename Tree::const_iterator i) : it(i), flat(false) {}
+
+    const T* p = nullptr;
+    typename Tree::const_iterator it{};
+    bool flat = true;
+  };
+  using iterator = const_iterator;
+  using value_type = T;
+
+  // Returns false if an equal element was present already (it is kept).
+  bool insert(const T& x) {
+    if (large)
+      return insertIntoTree(x);
+    const Less less;
+    if (items.empty() || less(items.back(), x)) {
+      items.push_back(x);
+      last = items.size() - 1;
+    } else {
+      // Ascending refills of a set that kept its elements meet each one right after the
+      // element the last insertion met.
+      std::size_t at = last + 1;
+      if (at < items.size() && !less(items[at], x) && !less(x, items[at])) {
+        last = at;
+        return false;
+      }
+      at = static_cast<std::size_t>(std::lower_bound(items.begin(), items.end(), x, less) -
+                                    items.begin());
+      last = at;
+      if (!less(x, items[at]))
+        return false;
+      items.insert(items.begin() + static_cast<std::ptrdiff_t>(at), x);
+    }
+    if (items.size() > kFlatLimit)
+      moveToTree();
+    return true;
+  }
+
+  // Returns false if no equal element was present.
+  bool del(const T& x) {
+    if (large)
+      return tree.erase(x) != 0;
+    const Less less;
+    auto at = std::lower_bound(items.begin(), items.end(), x, less);
+    if (at == items.end() || less(x, *at))
+      return false;
+    items.erase(at);
+    last = 0;
+    return true;
+  }
+
+  bool member(const T& x) const {
+    if (large)
+      return tree.find(x) != tree.end();
+    const Less less;
+    auto at = std::lower_bound(items.begin(), items.end(), x, less);
+    return at != items.end() && !less(x, *at);
+  }
+
+  int size() const { return static_cast<int>(large ? tree.size() : items.size()); }
+  bool empty() const { return size() == 0; }
+
+  // Keeps the array's capacity for the next filling; a tree's nodes are freed.
+  void clear() {
+    items.clear();
+    tree.clear();
+    large = false;
+    last = 0;
+  }
+
+  const_iterator begin() const {
+    return large ? const_iterator(tree.begin()) : const_iterator(items.data());
+  }
+  const_iterator end() const {
+    return large ? const_iterator(tree.end()) : const_iterator(items.data() + items.size());
+  }
+
+  // Cache hint for an insertion to come: where the next ascending element would go.
+  void prefetch() const {
+    if (!large && !items.empty())
+      __builtin_prefetch(items.data() + std::min(last + 1, items.size() - 1));
+  }
+
+private:
+  bool insertIntoTree(const T& x) {
+    const Less less;
+    if (!tree.empty() && less(*tree.rbegin(), x)) {
+      tree.insert(tree.end(), x);
+      return true;
+    }
+    return tree.insert(x).second;
+  }
+
+  void moveToTree() {
+    for (const T& x : items)
+      tree.insert(tree.end(), x);
+    items = std::vector<T>();
+    large = true;
+  }
+
+  std::vector<T> items; // sorted; holds the elements while !large
+  Tree tree;            // holds them once large
+  std::size_t last = 0; // where the last flat insertion met its element
+  bool large = false;
+};
+
+#endif
