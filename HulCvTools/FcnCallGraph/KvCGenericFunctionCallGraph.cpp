@@ -262,6 +262,9 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
   // The symbols are listed first and then treated in that order, the uses of all of them
   // in one sequence, so that prefetching runs ahead across symbol boundaries (a scheduler's
   // callees have one use each). Symbols made while treating are listed by a further walk.
+  // Debug indices beyond a few times the number of symbols are looked up in the map.
+  nodeCache.assign(static_cast<std::size_t>(data->getSymbolDB()->getNumberOfSymbols()) * 2 + 1024,
+                   nullptr);
   std::size_t listed = 0;
   for (;;) {
     std::vector<KvCParamSymbol*> functions;
@@ -273,6 +276,7 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
     treatFcnSymbols(functions);
   }
   addDeferredCalledFcns();
+  nodeCache = std::vector<leda::node>();
   return !incomplete;
 }
 
@@ -306,7 +310,8 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
     KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
     if (!info)
       continue;
-    steps.push_back(Step{Step::kNode, false, info, nullptr, function, nullptr, nullptr, nullptr});
+    steps.push_back(Step{Step::kNode, false, function->getDebugIndex(), -1, info, nullptr, function, nullptr,
+                         nullptr, nullptr});
     for (std::size_t u = starts[f]; u < starts[f + 1]; ++u) {
       if (u == prefetched) {
         const std::size_t n = std::min(KvCUsePrefetcher::kGroup, useBuffer.size() - u);
@@ -325,7 +330,8 @@ void KvCGenericFunctionCallGraph::recordUse(KV_ExprLocation* use) {
   // As enterUse and addCall decide, without changing the graph.
   KV_Operation* op = use->getOperation();
   if (!op) {
-    steps.push_back(Step{Step::kIncomplete, false, nullptr, nullptr, nullptr, nullptr, nullptr, nullptr});
+    steps.push_back(Step{Step::kIncomplete, false, -1, -1, nullptr, nullptr, nullptr, nullptr, nullptr,
+                         nullptr});
     return;
   }
   KV_Operation* above = op->getParentOperation();
@@ -338,10 +344,11 @@ void KvCGenericFunctionCallGraph::recordUse(KV_ExprLocation* use) {
   KvCFcgFunctionInfo* callingInfo = bothEnds ? provideFcgNodeInfo(calling) : nullptr;
   KvCFcgFunctionInfo* calledInfo = bothEnds ? provideFcgNodeInfo(called) : nullptr;
   if (callingInfo && calledInfo)
-    steps.push_back(
-        Step{Step::kEdge, calling == called, callingInfo, calledInfo, nullptr, call, nullptr, nullptr});
+    steps.push_back(Step{Step::kEdge, calling == called, calling->getDebugIndex(),
+                         called->getDebugIndex(), callingInfo, calledInfo, nullptr, call, nullptr,
+                         nullptr});
   else
-    steps.push_back(Step{Step::kCall, false, nullptr, nullptr, nullptr, call, nullptr, nullptr});
+    steps.push_back(Step{Step::kCall, false, -1, -1, nullptr, nullptr, nullptr, call, nullptr, nullptr});
 }
 
 void KvCGenericFunctionCallGraph::replaySteps() {
@@ -359,11 +366,11 @@ void KvCGenericFunctionCallGraph::replaySteps() {
       prefetchNodes(steps[i + kNear], true);
     Step& step = steps[i];
     if (step.kind == Step::kNode) {
-      registerNode(step.calling);
+      cachedNodeOf(step.calling, step.callingIndex);
       synchronizeNodeInfoAtConstruction(step.calling, step.function);
     } else if (step.kind == Step::kEdge) {
-      step.v = nodeOf(step.calling);
-      step.w = nodeOf(step.called);
+      step.v = cachedNodeOf(step.calling, step.callingIndex);
+      step.w = cachedNodeOf(step.called, step.calledIndex);
     }
   }
   for (std::size_t i = 0; i < n; ++i) {
@@ -389,20 +396,38 @@ void KvCGenericFunctionCallGraph::replaySteps() {
   steps.clear();
 }
 
+leda::node KvCGenericFunctionCallGraph::cachedNodeOf(KvCFcgFunctionInfo* function, int index) {
+  const auto slot = static_cast<std::size_t>(index);
+  if (index < 0 || slot >= nodeCache.size())
+    return nodeOf(function);
+  leda::node& cached = nodeCache[slot];
+  if (!cached || inf(cached) != function)
+    cached = nodeOf(function);
+  return cached;
+}
+
 void KvCGenericFunctionCallGraph::prefetchNodes(const Step& step, bool near) const {
   if (step.kind != Step::kNode && step.kind != Step::kEdge)
     return;
+  const int indices[2] = {step.callingIndex, step.kind == Step::kEdge ? step.calledIndex : -1};
+  for (int index : indices) {
+    const auto slot = static_cast<std::size_t>(index);
+    if (index < 0 || slot >= nodeCache.size())
+      continue;
+    if (!near)
+      prefetch(&nodeCache[slot]);
+    else
+      prefetch(nodeCache[slot]);
+  }
+  if (step.kind != Step::kNode)
+    return;
+  // A function's first record: its map entry, and its info for the node hook.
   if (!near) {
     nodes.prefetch_slot(step.calling);
-    if (step.kind == Step::kEdge)
-      nodes.prefetch_slot(step.called);
-    else
-      prefetch(step.calling); // for the node hook
-    return;
+    prefetch(step.calling);
+  } else {
+    nodes.prefetch_entry(step.calling);
   }
-  nodes.prefetch_entry(step.calling);
-  if (step.kind == Step::kEdge)
-    nodes.prefetch_entry(step.called);
 }
 
 void KvCGenericFunctionCallGraph::prefetchEdge(const Step& step, bool near) const {

@@ -133,6 +133,10 @@ private:
     };
     Kind kind;
     bool selfCall;
+    // Debug indices of the calling and the called symbol (kNode: of `function`), or -1;
+    // they key the node cache of a construction run.
+    int callingIndex;
+    int calledIndex;
     KvCFcgFunctionInfo* calling;
     KvCFcgFunctionInfo* called;
     KvCParamSymbol* function;
@@ -145,6 +149,9 @@ private:
   // Carries out the recorded steps in order and forgets them.
   void replaySteps();
   void prefetchNodes(const Step& step, bool near) const;
+  // The node of `function` through the run's node cache (slot `index`), registering it
+  // when missing.
+  leda::node cachedNodeOf(KvCFcgFunctionInfo* function, int index);
   void prefetchEdge(const Step& step, bool near) const;
   // addEdge between registered nodes.
   bool addEdgeBetween(leda::node v, leda::node w, leda::edge& e);
@@ -165,6 +172,9 @@ private:
   std::vector<KV_ExprLocation*> useBuffer;
   std::vector<KV_ExprLocation*> listedUses;
   std::vector<Step> steps;
+  // During construction: nodes by symbol debug index, checked against their info before
+  // use. Most calls find their calling function here instead of in the node map.
+  std::vector<leda::node> nodeCache;
   // Called functions still to be added to their calling function's set: construction adds
   // them calling function by calling function, which loads each set once instead of once
   // per call.
