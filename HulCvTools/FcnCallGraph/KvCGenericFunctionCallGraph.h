@@ -18,6 +18,13 @@
 //
 // The virtual hooks let derived graphs (recursion analysis, reuse graph) change what the
 // nodes and edges carry.
+//
+// construct gives the graph and the function infos that entering every use's call with
+// addCall in symbol order would give, and calls each hook kind in that order. It works in
+// batches (read the model, register the nodes, enter edges and calls), so node hooks of a
+// batch run before its edge hooks, and it adds the called functions to the calling
+// functions' sets at the end, calling function by calling function: hooks must not rely
+// on those sets during construction. Cost: O(uses + functions) expected.
 #ifndef HULCVTOOLS_FCNCALLGRAPH_KVCGENERICFUNCTIONCALLGRAPH_H
 #define HULCVTOOLS_FCNCALLGRAPH_KVCGENERICFUNCTIONCALLGRAPH_H
 

@@ -263,8 +263,12 @@ TEST(ExprLocDBTest, RandomSequenceAgreesWithReference) {
       if (expected)
         where.erase(it);
     }
-    // Compare every category of every database with the reference.
+    // Compare every category of every database with the reference, and the fast listing
+    // of the uses with the keyed one.
     for (int dd = 0; dd < 3; ++dd) {
+      std::vector<KV_ExprLocation*> fast;
+      dbs[static_cast<std::size_t>(dd)]->listUses(fast);
+      ASSERT_EQ(fast, uses(*dbs[static_cast<std::size_t>(dd)])) << "step " << stepNo;
       for (tagKvEExprLocDBCategory c : kAllCategories) {
         std::vector<KV_ExprLocation*> want;
         for (const auto& [key, place] : where)
