@@ -18,6 +18,7 @@
 #include <algorithm>
 #include <cstddef>
 #include <iterator>
+#include <memory>
 #include <set>
 #include <vector>
 
@@ -69,7 +70,7 @@ public:
 
   // Returns false if an equal element was present already (it is kept).
   bool insert(const T& x) {
-    if (large)
+    if (tree)
       return insertIntoTree(x);
     const Less less;
     if (items.empty() || less(items.back(), x)) {
@@ -97,8 +98,8 @@ public:
 
   // Returns false if no equal element was present.
   bool del(const T& x) {
-    if (large)
-      return tree.erase(x) != 0;
+    if (tree)
+      return tree->erase(x) != 0;
     const Less less;
     auto at = std::lower_bound(items.begin(), items.end(), x, less);
     if (at == items.end() || less(x, *at))
@@ -109,58 +110,54 @@ public:
   }
 
   bool member(const T& x) const {
-    if (large)
-      return tree.find(x) != tree.end();
+    if (tree)
+      return tree->find(x) != tree->end();
     const Less less;
     auto at = std::lower_bound(items.begin(), items.end(), x, less);
     return at != items.end() && !less(x, *at);
   }
 
-  int size() const { return static_cast<int>(large ? tree.size() : items.size()); }
+  int size() const { return static_cast<int>(tree ? tree->size() : items.size()); }
   bool empty() const { return size() == 0; }
 
   // Keeps the array's capacity for the next filling; a tree's nodes are freed.
   void clear() {
     items.clear();
-    tree.clear();
-    large = false;
+    tree.reset();
     last = 0;
   }
 
   const_iterator begin() const {
-    return large ? const_iterator(tree.begin()) : const_iterator(items.data());
+    return tree ? const_iterator(tree->cbegin()) : const_iterator(items.data());
   }
   const_iterator end() const {
-    return large ? const_iterator(tree.end()) : const_iterator(items.data() + items.size());
+    return tree ? const_iterator(tree->cend()) : const_iterator(items.data() + items.size());
   }
 
   // Cache hint for an insertion to come: where the next ascending element would go.
   void prefetch() const {
-    if (!large && !items.empty())
+    if (!tree && !items.empty())
       __builtin_prefetch(items.data() + std::min(last + 1, items.size() - 1));
   }
 
 private:
   bool insertIntoTree(const T& x) {
     const Less less;
-    if (!tree.empty() && less(*tree.rbegin(), x)) {
-      tree.insert(tree.end(), x);
+    if (!tree->empty() && less(*tree->rbegin(), x)) {
+      tree->insert(tree->end(), x);
       return true;
     }
-    return tree.insert(x).second;
+    return tree->insert(x).second;
   }
 
   void moveToTree() {
-    for (const T& x : items)
-      tree.insert(tree.end(), x);
+    tree = std::make_unique<Tree>(items.begin(), items.end());
     items = std::vector<T>();
-    large = true;
   }
 
-  std::vector<T> items; // sorted; holds the elements while !large
-  Tree tree;            // holds them once large
-  std::size_t last = 0; // where the last flat insertion met its element
-  bool large = false;
+  std::vector<T> items;      // sorted; holds the elements while the set is small
+  std::unique_ptr<Tree> tree; // holds them once large
+  std::size_t last = 0;      // where the last flat insertion met its element
 };
 
 #endif
