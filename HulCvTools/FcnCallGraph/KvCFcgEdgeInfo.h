@@ -12,6 +12,10 @@
 #include "HulCvTools/HulCvToolsExport.h"
 #include "HulCvTools/ModelInterfaces/ViewFwd.h"
 
+#include <cstddef>
+
+class KvCObjectPool;
+
 class HULCV_API KvCFcgEdgeInfo {
 public:
   // Serial number of the next edge info; a plain counter (one pass at a time).
@@ -35,6 +39,9 @@ public:
   int getDebugIndex() const { return debugIndex; }
 
   HULCV_HEAP_OPERATORS
+  // Storage from a pool; such an info is still released by a plain delete.
+  static void* operator new(std::size_t size, KvCObjectPool& pool) noexcept;
+  static void operator delete(void* object, KvCObjectPool& pool) noexcept;
 
 private:
   bool taskCall = false;

@@ -1,6 +1,7 @@
 #include "HulCvTools/FcnCallGraph/KvCGenericFunctionCallGraph.h"
 
 #include "HulCvTools/Control/KvCInternalCheck.h"
+#include "HulCvTools/Control/KvCObjectPool.h"
 #include "HulCvTools/FcnCallGraph/KvCFcgQuery.h"
 #include "HulCvTools/FcnCallGraph/KvCFcnSmbVisitor.h"
 #include "HulCvTools/ModelInterfaces/ICodeModel.h"
@@ -14,6 +15,12 @@ template class leda::GRAPH<KvCFcgFunctionInfo*, KvCFcgEdgeInfo*>;
 
 int KvCFcgEdgeInfo::s_DebugIndex = 0;
 HULCV_DEFINE_HEAP_OPERATORS(KvCFcgEdgeInfo)
+void* KvCFcgEdgeInfo::operator new(std::size_t size, KvCObjectPool& pool) noexcept {
+  return pool.allocate(size);
+}
+void KvCFcgEdgeInfo::operator delete(void* object, KvCObjectPool& /*pool*/) noexcept {
+  hulcv_detail::freeObject(object);
+}
 
 KvCFcgFunctor::~KvCFcgFunctor() = default;
 bool KvCFcgFunctor::stopIteration() { return false; }
@@ -130,7 +137,8 @@ private:
 };
 
 KvCGenericFunctionCallGraph::KvCGenericFunctionCallGraph()
-    : edgeIndex(std::make_unique<KvCFcgEdgeIndex>(*this)) {}
+    : edgeIndex(std::make_unique<KvCFcgEdgeIndex>(*this)),
+      edgeInfoPool(std::make_unique<KvCObjectPool>(sizeof(KvCFcgEdgeInfo))) {}
 
 KvCGenericFunctionCallGraph::~KvCGenericFunctionCallGraph() { deleteAllEdges(); }
 
@@ -768,7 +776,11 @@ void KvCGenericFunctionCallGraph::deleteFcgNodeInfo(KvCFcgFunctionInfo* function
 void KvCGenericFunctionCallGraph::synchronizeNodeInfoAtConstruction(KvCFcgFunctionInfo*,
                                                                     KvCParamSymbol*) {}
 
-KvCFcgEdgeInfo* KvCGenericFunctionCallGraph::createFcgEdgeInfo() { return new KvCFcgEdgeInfo; }
+KvCFcgEdgeInfo* KvCGenericFunctionCallGraph::createFcgEdgeInfo() {
+  // From the graph's pool: no heap call per edge, and infos made one after another lie
+  // together. A plain delete releases them (deleteFcgEdgeInfo).
+  return new (*edgeInfoPool) KvCFcgEdgeInfo;
+}
 
 void KvCGenericFunctionCallGraph::deleteFcgEdgeInfo(KvCFcgEdgeInfo* info) { delete info; }
 

@@ -43,6 +43,7 @@
 
 class KvCFcnSmbVisitor;
 class KvCFcgEdgeIndex;
+class KvCObjectPool;
 
 // The graph of every call graph: instantiated (and exported) once, by the library.
 extern template class HULCV_API leda::GRAPH<KvCFcgFunctionInfo*, KvCFcgEdgeInfo*>;
@@ -175,6 +176,9 @@ private:
   leda::map<KvCFcgFunctionInfo*, leda::node> nodes;
   bool incomplete = true;
   std::unique_ptr<KvCFcgEdgeIndex> edgeIndex;
+  // Storage of the edge infos the base hook makes (the destructor deletes every info
+  // before the pool goes).
+  std::unique_ptr<KvCObjectPool> edgeInfoPool;
   // Reused by construction for the uses of one symbol at a time.
   std::vector<KV_ExprLocation*> useBuffer;
   std::vector<KV_ExprLocation*> listedUses;
