@@ -24,9 +24,9 @@ namespace hulcv_detail {
 struct KvCObjectPoolState {
   explicit KvCObjectPoolState(std::size_t objectSize)
       : objectSize(objectSize),
-        blockSize((sizeof(BlockHeader) + std::max(objectSize, sizeof(void*)) +
-                   alignof(BlockHeader) - 1) /
-                  alignof(BlockHeader) * alignof(BlockHeader)) {}
+        blockSize(
+            (sizeof(BlockHeader) + std::max(objectSize, sizeof(void*)) + alignof(BlockHeader) - 1) /
+            alignof(BlockHeader) * alignof(BlockHeader)) {}
   ~KvCObjectPoolState() {
     for (const Chunk& c : chunks)
       freeObject(c.memory);
@@ -51,10 +51,10 @@ struct KvCObjectPoolState {
   bool addChunk() noexcept {
     constexpr std::size_t kFirstBlocks = 64;
     constexpr std::size_t kMaxChunkBytes = std::size_t{1} << 16;
-    const std::size_t blocks =
-        chunks.empty() ? kFirstBlocks
-                       : std::max<std::size_t>(
-                             1, std::min(chunks.back().blocks * 2, kMaxChunkBytes / blockSize));
+    const std::size_t blocks = chunks.empty()
+                                   ? kFirstBlocks
+                                   : std::max<std::size_t>(1, std::min(chunks.back().blocks * 2,
+                                                                       kMaxChunkBytes / blockSize));
     auto* memory = static_cast<unsigned char*>(allocObject(blocks * blockSize));
     if (!memory)
       return false;
@@ -144,8 +144,7 @@ void* KvCObjectPool::allocate(std::size_t size) noexcept {
   void* block = state->take();
   if (!block)
     return nullptr;
-  auto* header =
-      ::new (block) BlockHeader{reinterpret_cast<std::uintptr_t>(state) | kPooled};
+  auto* header = ::new (block) BlockHeader{reinterpret_cast<std::uintptr_t>(state) | kPooled};
   ++state->live;
   return header + 1;
 }

@@ -1,4 +1,5 @@
 #include "HulCvTools/FcnCallGraph/KvCGenericFunctionCallGraph.h"
+#include "platform/support/KvCPrefetch.h"
 
 #include "HulCvTools/Control/KvCInternalCheck.h"
 #include "HulCvTools/Control/KvCObjectPool.h"
@@ -101,7 +102,7 @@ public:
   // Cache hint for a lookup or insertion of the pair to come.
   void prefetch(leda::node v, leda::node w) const {
     if (!slots.empty())
-      __builtin_prefetch(&slots[home(v, w)]);
+      KvCPrefetch::read(&slots[home(v, w)]);
   }
 
 private:
@@ -172,7 +173,7 @@ private:
 
 inline void prefetch(const void* p) {
   if (p)
-    __builtin_prefetch(p);
+    KvCPrefetch::read(p);
 }
 
 // Walks a group of uses up the model far enough to know each call's calling function
@@ -318,8 +319,8 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
     KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
     if (!info)
       continue;
-    steps.push_back(Step{Step::kNode, false, function->getDebugIndex(), -1, info, nullptr, function, nullptr,
-                         nullptr, nullptr});
+    steps.push_back(Step{Step::kNode, false, function->getDebugIndex(), -1, info, nullptr, function,
+                         nullptr, nullptr, nullptr});
     for (std::size_t u = starts[f]; u < starts[f + 1]; ++u) {
       if (u == prefetched) {
         const std::size_t n = std::min(KvCUsePrefetcher::kGroup, useBuffer.size() - u);
@@ -338,8 +339,8 @@ void KvCGenericFunctionCallGraph::recordUse(KV_ExprLocation* use) {
   // As enterUse and addCall decide, without changing the graph.
   KV_Operation* op = use->getOperation();
   if (!op) {
-    steps.push_back(Step{Step::kIncomplete, false, -1, -1, nullptr, nullptr, nullptr, nullptr, nullptr,
-                         nullptr});
+    steps.push_back(Step{Step::kIncomplete, false, -1, -1, nullptr, nullptr, nullptr, nullptr,
+                         nullptr, nullptr});
     return;
   }
   KV_Operation* above = op->getParentOperation();
@@ -356,7 +357,8 @@ void KvCGenericFunctionCallGraph::recordUse(KV_ExprLocation* use) {
                          called->getDebugIndex(), callingInfo, calledInfo, nullptr, call, nullptr,
                          nullptr});
   else
-    steps.push_back(Step{Step::kCall, false, -1, -1, nullptr, nullptr, nullptr, call, nullptr, nullptr});
+    steps.push_back(
+        Step{Step::kCall, false, -1, -1, nullptr, nullptr, nullptr, call, nullptr, nullptr});
 }
 
 void KvCGenericFunctionCallGraph::replaySteps() {

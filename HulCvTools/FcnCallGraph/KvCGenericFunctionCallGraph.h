@@ -190,8 +190,8 @@ private:
   // them calling function by calling function, which loads each set once instead of once
   // per call.
   struct DeferredCalled {
-    int callingNode;       // index of the calling node
-    int calledDebugIndex;  // with calledSymbol, the called function as its set keeps it
+    int callingNode;      // index of the calling node
+    int calledDebugIndex; // with calledSymbol, the called function as its set keeps it
     KvCFcgFunctionInfo* calling;
     KvCParamSymbol* calledSymbol;
   };

@@ -1,4 +1,5 @@
 #include "platform/icode/KvCExprLocDB.h"
+#include "platform/support/KvCPrefetch.h"
 
 #include "platform/icode/KV_ExprLocation.h"
 #include "platform/icode/KV_Operation.h"
@@ -72,14 +73,14 @@ void KvCExprLocDB::listUses(std::vector<KV_ExprLocation*>& uses) const {
 }
 
 void KvCExprLocDB::prefetchUseRecords() const {
-  __builtin_prefetch(&entries[KV_DB_USE]);
-  __builtin_prefetch(&entries[KV_DB_QSO_USE]);
+  KvCPrefetch::read(&entries[KV_DB_USE]);
+  KvCPrefetch::read(&entries[KV_DB_QSO_USE]);
 }
 
 void KvCExprLocDB::prefetchUses() const {
   for (int c = KV_DB_USE; c <= KV_DB_QSO_USE; ++c)
     if (!entries[c].empty())
-      __builtin_prefetch(entries[c].data());
+      KvCPrefetch::read(entries[c].data());
 }
 
 void KvCExprLocDB::listCategory(tagKvEExprLocDBCategory category,

@@ -15,6 +15,7 @@
 #ifndef HUL_PLATFORM_ICODE_KVCFCGSORTEDSET_H
 #define HUL_PLATFORM_ICODE_KVCFCGSORTEDSET_H
 
+#include "platform/support/KvCPrefetch.h"
 #include <algorithm>
 #include <cstddef>
 #include <iterator>
@@ -137,7 +138,7 @@ public:
   // Cache hint for an insertion to come: where the next ascending element would go.
   void prefetch() const {
     if (!tree && !items.empty())
-      __builtin_prefetch(items.data() + std::min(last + 1, items.size() - 1));
+      KvCPrefetch::read(items.data() + std::min(last + 1, items.size() - 1));
   }
 
 private:
@@ -155,9 +156,9 @@ private:
     items = std::vector<T>();
   }
 
-  std::vector<T> items;      // sorted; holds the elements while the set is small
+  std::vector<T> items;       // sorted; holds the elements while the set is small
   std::unique_ptr<Tree> tree; // holds them once large
-  std::size_t last = 0;      // where the last flat insertion met its element
+  std::size_t last = 0;       // where the last flat insertion met its element
 };
 
 #endif

@@ -1,4 +1,5 @@
 #include "platform/icode/KvCICodeIterator.h"
+#include "platform/support/KvCPrefetch.h"
 
 #include "platform/icode/KV_Constant.h"
 #include "platform/icode/KV_ExprLocation.h"
@@ -91,7 +92,7 @@ public:
   }
   void step() {
     for (int i = 0; i < kLinesPerStep && cursor < limit; ++i, cursor += kLine)
-      __builtin_prefetch(cursor);
+      KvCPrefetch::read(cursor);
   }
 
 private:

@@ -24,8 +24,7 @@ KvCParamSymbol::KvCParamSymbol(int index, WmCXString symbolName, KV_DataType* re
 
 KvCParamSymbol::~KvCParamSymbol() = default;
 
-bool KvCFcgCallsBySerial::operator()(const KvCCallOperation* a,
-                                     const KvCCallOperation* b) const {
+bool KvCFcgCallsBySerial::operator()(const KvCCallOperation* a, const KvCCallOperation* b) const {
   return (a ? a->getSerial() : -1) < (b ? b->getSerial() : -1);
 }
 

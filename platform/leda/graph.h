@@ -18,6 +18,7 @@
 #define HULCVTOOLS_PLATFORM_LEDA_GRAPH_H
 
 #include "platform/leda/array.h"
+#include "platform/support/KvCPrefetch.h"
 
 #include <algorithm>
 #include <cassert>
@@ -327,10 +328,10 @@ public:
   bool is_hidden(edge e) const { return e->hidden(); }
   // Cache hints for a new edge out of v to come: v's record, then (once that is cached)
   // v's last outgoing edge, which the new edge is linked after.
-  static void prefetch_node(node v) { __builtin_prefetch(v, 1); }
+  static void prefetch_node(node v) { KvCPrefetch::write(v); }
   static void prefetch_out_end(node v) {
     if (v->outLast)
-      __builtin_prefetch(v->outLast, 1);
+      KvCPrefetch::write(v->outLast);
   }
 
   void restore_edge(edge e) {

@@ -11,6 +11,7 @@
 #ifndef HULCVTOOLS_PLATFORM_LEDA_MAP_H
 #define HULCVTOOLS_PLATFORM_LEDA_MAP_H
 
+#include "platform/support/KvCPrefetch.h"
 #include <cstddef>
 #include <cstdint>
 #include <deque>
@@ -129,7 +130,7 @@ public:
   // cached) the first entry whose hash matches. Neither reads an entry.
   void prefetch_slot(const K& k) const {
     if (!slots_.empty())
-      __builtin_prefetch(&slots_[hashOf(k) & mask()]);
+      KvCPrefetch::read(&slots_[hashOf(k) & mask()]);
   }
   void prefetch_entry(const K& k) const {
     if (slots_.empty())
@@ -137,7 +138,7 @@ public:
     const std::size_t h = hashOf(k);
     for (std::size_t i = h & mask(); slots_[i].entry != kNone; i = (i + 1) & mask()) {
       if (slots_[i].hash == h) {
-        __builtin_prefetch(&entryAt(slots_[i].entry));
+        KvCPrefetch::read(&entryAt(slots_[i].entry));
         return;
       }
     }

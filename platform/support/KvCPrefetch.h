@@ -1,0 +1,23 @@
+// KvCPrefetch: cache hints that survive optimisation.
+//
+// __builtin_prefetch has no effect the optimiser must keep. A small function that only
+// reads a table and prefetches an entry of it therefore counts as free of side effects,
+// and a call of it whose result is unused is deleted as dead code: the hint silently
+// disappears. The empty volatile asm that takes the address is an effect the optimiser
+// keeps; it emits no instruction.
+#ifndef HUL_PLATFORM_SUPPORT_KVCPREFETCH_H
+#define HUL_PLATFORM_SUPPORT_KVCPREFETCH_H
+
+struct KvCPrefetch {
+  // Hints that the line holding `p` will be read (write: written) soon. Never faults.
+  static void read(const void* p) {
+    __builtin_prefetch(p, 0);
+    asm volatile("" : : "r"(p));
+  }
+  static void write(const void* p) {
+    __builtin_prefetch(p, 1);
+    asm volatile("" : : "r"(p));
+  }
+};
+
+#endif
