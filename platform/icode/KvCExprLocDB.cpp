@@ -9,7 +9,7 @@
 
 #include <algorithm>
 
-KvCExprLocDB::KvCExprLocDB() : qsoPart(this) {}
+KvCExprLocDB::KvCExprLocDB() : qsoPart(this) { std::fill(std::begin(lastSerial), std::end(lastSerial), -1); }
 
 KvCExprLocDB::~KvCExprLocDB() { clear(); }
 
@@ -25,6 +25,9 @@ bool KvCExprLocDB::add(tagKvEExprLocDBCategory category, KV_ExprLocation* loc) {
   std::vector<KV_ExprLocation*>& list = entries[category];
   slot = KV_ExprLocation::DbSlot{this, category, static_cast<int>(list.size())};
   list.push_back(loc);
+  if (loc->getSerial() <= lastSerial[category])
+    unsorted |= 1U << category;
+  lastSerial[category] = loc->getSerial();
   return true;
 }
 
@@ -36,6 +39,8 @@ bool KvCExprLocDB::removeSide(bool defSide, KV_ExprLocation* loc) {
     return false;
   std::vector<KV_ExprLocation*>& list = entries[slot.category];
   KV_ExprLocation* last = list.back();
+  if (last != loc)
+    unsorted |= 1U << slot.category; // the last entry moves into the gap
   list[static_cast<std::size_t>(slot.position)] = last;
   (defSide ? last->defSlot : last->useSlot).position = slot.position;
   list.pop_back();
@@ -65,8 +70,18 @@ void KvCExprLocDB::listUses(leda::dictionary<int, KV_ExprLocation*>& uses) const
 
 void KvCExprLocDB::listUses(std::vector<KV_ExprLocation*>& uses) const {
   uses.clear();
-  for (int c = KV_DB_USE; c <= KV_DB_QSO_USE; ++c)
+  int filled = 0;
+  bool sorted = true;
+  for (int c = KV_DB_USE; c <= KV_DB_QSO_USE; ++c) {
+    if (entries[c].empty())
+      continue;
     uses.insert(uses.end(), entries[c].begin(), entries[c].end());
+    ++filled;
+    sorted = sorted && !(unsorted & (1U << c));
+  }
+  // One category in serial order is the answer as it stands (no location is read).
+  if (filled <= 1 && sorted)
+    return;
   std::sort(uses.begin(), uses.end(), [](const KV_ExprLocation* a, const KV_ExprLocation* b) {
     return a->getSerial() < b->getSerial();
   });
@@ -125,7 +140,9 @@ void KvCExprLocDB::clear() {
     for (KV_ExprLocation* loc : entries[c])
       (defSide ? loc->defSlot : loc->useSlot) = KV_ExprLocation::DbSlot{};
     entries[c].clear();
+    lastSerial[c] = -1;
   }
+  unsorted = 0;
 }
 
 bool KvCQsoExprLocDB::addStaticDeclDefDef(KV_ExprLocation* loc) {

@@ -59,6 +59,8 @@ public:
   void listDefs(leda::dictionary<int, KV_ExprLocation*>& defs) const;
   void listUses(leda::dictionary<int, KV_ExprLocation*>& uses) const;
   // The uses in ascending serial order, into a vector the caller may reuse (cleared first).
+  // O(number of uses) when the uses were entered in ascending serial order (as a walk of the
+  // ICode enters them) and none was removed from the middle since; O(n log n) otherwise.
   void listUses(std::vector<KV_ExprLocation*>& uses) const;
   // Cache hints for a listUses to come, in two stages: the database's own records of its
   // uses, then (once those are cached) the uses' arrays.
@@ -80,6 +82,10 @@ private:
   void listRange(int first, int last, leda::dictionary<int, KV_ExprLocation*>& out) const;
 
   std::vector<KV_ExprLocation*> entries[KV_DB_NUMBER_OF_CATEGORIES];
+  // Per category: the serial number of the last entry added, and (one bit each) whether
+  // the entries may be out of ascending serial order.
+  int lastSerial[KV_DB_NUMBER_OF_CATEGORIES];
+  unsigned unsorted = 0;
   KvCQsoExprLocDB qsoPart;
 };
 
