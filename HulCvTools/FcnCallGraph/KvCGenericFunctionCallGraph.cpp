@@ -322,10 +322,12 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
     steps.push_back(Step{Step::kNode, false, function->getDebugIndex(), -1, info, nullptr, function,
                          nullptr, nullptr, nullptr});
     for (std::size_t u = starts[f]; u < starts[f + 1]; ++u) {
-      if (u == prefetched) {
-        const std::size_t n = std::min(KvCUsePrefetcher::kGroup, useBuffer.size() - u);
-        prefetcher.run(useBuffer.data() + u, n);
-        prefetched = u + n;
+      // The prefetcher stays a group ahead, so its fetches land while the current group
+      // is recorded.
+      while (prefetched < useBuffer.size() && prefetched <= u + KvCUsePrefetcher::kGroup) {
+        const std::size_t n = std::min(KvCUsePrefetcher::kGroup, useBuffer.size() - prefetched);
+        prefetcher.run(useBuffer.data() + prefetched, n);
+        prefetched += n;
       }
       recordUse(useBuffer[u]);
     }
