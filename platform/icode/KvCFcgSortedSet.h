@@ -99,8 +99,15 @@ public:
 
   // Returns false if no equal element was present.
   bool del(const T& x) {
-    if (tree)
-      return tree->erase(x) != 0;
+    if (tree) {
+      auto at = tree->find(x);
+      if (at == tree->end())
+        return false;
+      if (at == finger)
+        finger = tree->end();
+      tree->erase(at);
+      return true;
+    }
     const Less less;
     auto at = std::lower_bound(items.begin(), items.end(), x, less);
     if (at == items.end() || less(x, *at))
@@ -144,20 +151,33 @@ public:
 private:
   bool insertIntoTree(const T& x) {
     const Less less;
-    if (!tree->empty() && less(*tree->rbegin(), x)) {
-      tree->insert(tree->end(), x);
-      return true;
+    // Like the array form: an ascending pass meets each element right after the one the
+    // last insertion met (O(1) amortized instead of a descent through the tree).
+    if (finger != tree->end()) {
+      const auto next = std::next(finger);
+      if (next != tree->end() && !less(*next, x) && !less(x, *next)) {
+        finger = next;
+        return false;
+      }
+      if (less(*finger, x) && (next == tree->end() || less(x, *next))) {
+        finger = tree->insert(next, x);
+        return true;
+      }
     }
-    return tree->insert(x).second;
+    const auto [at, inserted] = tree->insert(x);
+    finger = at;
+    return inserted;
   }
 
   void moveToTree() {
     tree = std::make_unique<Tree>(items.begin(), items.end());
+    finger = tree->end();
     items = std::vector<T>();
   }
 
   std::vector<T> items;       // sorted; holds the elements while the set is small
   std::unique_ptr<Tree> tree; // holds them once large
+  typename Tree::iterator finger; // in the tree: the element the last insertion met, or end
   std::size_t last = 0;       // where the last flat insertion met its element
 };
 
