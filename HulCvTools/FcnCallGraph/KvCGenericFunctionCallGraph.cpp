@@ -1,11 +1,11 @@
 #include "HulCvTools/FcnCallGraph/KvCGenericFunctionCallGraph.h"
-#include "platform/support/KvCPrefetch.h"
 
 #include "HulCvTools/Control/KvCInternalCheck.h"
 #include "HulCvTools/Control/KvCObjectPool.h"
 #include "HulCvTools/FcnCallGraph/KvCFcgQuery.h"
 #include "HulCvTools/FcnCallGraph/KvCFcnSmbVisitor.h"
 #include "HulCvTools/ModelInterfaces/ICodeModel.h"
+#include "platform/support/KvCPrefetch.h"
 
 #include <algorithm>
 #include <cstdint>
@@ -171,11 +171,6 @@ private:
   bool visitAllSymbols;
 };
 
-inline void prefetch(const void* p) {
-  if (p)
-    KvCPrefetch::read(p);
-}
-
 // Walks a group of uses up the model far enough to know each call's calling function
 // info, issuing a prefetch at every step. The uses of one group are independent, so
 // their cache misses overlap instead of being taken one after another when the calls are
@@ -187,9 +182,9 @@ public:
   void run(KV_ExprLocation* const* uses, std::size_t n) {
     for (std::size_t j = 0; j < n; ++j) {
       const KV_ExprLocation* use = uses[j];
-      prefetch(use->getExpression());
+      KvCPrefetch::read(use->getExpression());
       cursor[j] = use->getParent();
-      prefetch(cursor[j]);
+      KvCPrefetch::read(cursor[j]);
       state[j] = kCall;
     }
     for (int round = 0; round < kRounds; ++round)
@@ -213,7 +208,7 @@ private:
       KvCCallOperation* call = op ? op->asCallOperation() : nullptr;
       if (call && call->isCallingSymbolKnown()) {
         symbols[j] = call->getCallingSymbol();
-        prefetch(symbols[j]);
+        KvCPrefetch::read(symbols[j]);
         state[j] = symbols[j] ? kSymbol : kDone;
         break;
       }
@@ -231,13 +226,13 @@ private:
       break;
     case kTable: {
       KvCParamSymbol* symbol = static_cast<KvCCStmTable*>(e)->getCodeBlockSymbol();
-      prefetch(symbol);
+      KvCPrefetch::read(symbol);
       symbols[j] = symbol;
       state[j] = symbol ? kSymbol : kDone;
       break;
     }
     case kSymbol:
-      prefetch(symbols[j]->getFunctionInfo());
+      KvCPrefetch::read(symbols[j]->getFunctionInfo());
       state[j] = kDone;
       break;
     case kDone:
@@ -246,7 +241,7 @@ private:
   }
 
   void advance(std::size_t j, KV_ICodeElem* next, State s) {
-    prefetch(next);
+    KvCPrefetch::read(next);
     cursor[j] = next;
     state[j] = next ? s : kDone;
   }
@@ -314,13 +309,15 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
   std::size_t prefetched = 0;
   for (std::size_t f = 0; f < count; ++f) {
     if (f + 8 < count)
-      prefetch(functions[f + 8]);
+      KvCPrefetch::read(functions[f + 8]);
     KvCParamSymbol* function = functions[f];
     KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
     if (!info)
       continue;
-    steps.push_back(Step{Step::kNode, false, function->getDebugIndex(), -1, info, nullptr, function,
-                         nullptr, nullptr, nullptr});
+    steps.push_back(Step{.kind = Step::kNode,
+                         .callingIndex = function->getDebugIndex(),
+                         .calling = info,
+                         .function = function});
     for (std::size_t u = starts[f]; u < starts[f + 1]; ++u) {
       // The prefetcher stays a group ahead, so its fetches land while the current group
       // is recorded.
@@ -341,8 +338,7 @@ void KvCGenericFunctionCallGraph::recordUse(KV_ExprLocation* use) {
   // As enterUse and addCall decide, without changing the graph.
   KV_Operation* op = use->getOperation();
   if (!op) {
-    steps.push_back(Step{Step::kIncomplete, false, -1, -1, nullptr, nullptr, nullptr, nullptr,
-                         nullptr, nullptr});
+    steps.push_back(Step{.kind = Step::kIncomplete});
     return;
   }
   KV_Operation* above = op->getParentOperation();
@@ -355,12 +351,15 @@ void KvCGenericFunctionCallGraph::recordUse(KV_ExprLocation* use) {
   KvCFcgFunctionInfo* callingInfo = bothEnds ? provideFcgNodeInfo(calling) : nullptr;
   KvCFcgFunctionInfo* calledInfo = bothEnds ? provideFcgNodeInfo(called) : nullptr;
   if (callingInfo && calledInfo)
-    steps.push_back(Step{Step::kEdge, calling == called, calling->getDebugIndex(),
-                         called->getDebugIndex(), callingInfo, calledInfo, nullptr, call, nullptr,
-                         nullptr});
+    steps.push_back(Step{.kind = Step::kEdge,
+                         .selfCall = calling == called,
+                         .callingIndex = calling->getDebugIndex(),
+                         .calledIndex = called->getDebugIndex(),
+                         .calling = callingInfo,
+                         .called = calledInfo,
+                         .call = call});
   else
-    steps.push_back(
-        Step{Step::kCall, false, -1, -1, nullptr, nullptr, nullptr, call, nullptr, nullptr});
+    steps.push_back(Step{.kind = Step::kCall, .call = call});
 }
 
 void KvCGenericFunctionCallGraph::replaySteps() {
@@ -427,9 +426,9 @@ void KvCGenericFunctionCallGraph::prefetchNodes(const Step& step, bool near) con
     if (index < 0 || slot >= nodeCache.size())
       continue;
     if (!near)
-      prefetch(&nodeCache[slot]);
+      KvCPrefetch::read(&nodeCache[slot]);
     else
-      prefetch(nodeCache[slot]);
+      KvCPrefetch::read(nodeCache[slot]);
   }
   if (step.kind != Step::kNode)
     return;
@@ -437,11 +436,11 @@ void KvCGenericFunctionCallGraph::prefetchNodes(const Step& step, bool near) con
   // and the symbol's body.
   if (!near) {
     nodes.prefetch_slot(step.calling);
-    prefetch(step.calling);
-    prefetch(step.function);
+    KvCPrefetch::read(step.calling);
+    KvCPrefetch::read(step.function);
   } else {
     nodes.prefetch_entry(step.calling);
-    prefetch(step.function->getBodySTT());
+    KvCPrefetch::read(step.function->getBodySTT());
   }
 }
 
@@ -452,8 +451,8 @@ void KvCGenericFunctionCallGraph::prefetchEdge(const Step& step, bool near) cons
     edgeIndex->prefetch(step.v, step.w);
     prefetch_node(step.v);
     prefetch_node(step.w);
-    prefetch(step.called);
-    prefetch(step.call);
+    KvCPrefetch::read(step.called);
+    KvCPrefetch::read(step.call);
     return;
   }
   prefetch_out_end(step.v);
@@ -490,7 +489,7 @@ void KvCGenericFunctionCallGraph::addDeferredCalledFcns() {
   const std::size_t n = deferredByCaller.size();
   for (std::size_t i = 0; i < n; ++i) {
     if (i + kAhead < n)
-      prefetch(deferredByCaller[i + kAhead].calling);
+      KvCPrefetch::read(deferredByCaller[i + kAhead].calling);
     if (i + kAhead / 2 < n)
       deferredByCaller[i + kAhead / 2].calling->getCalledFunctionsSet().prefetch();
     const DeferredCalled& d = deferredByCaller[i];
@@ -699,7 +698,7 @@ void KvCGenericFunctionCallGraph::deleteAllNodes() {
     lead = succ_node(lead);
   for (leda::node v = first_node(); v; v = succ_node(v)) {
     if (lead) {
-      prefetch(inf(lead));
+      KvCPrefetch::read(inf(lead));
       lead = succ_node(lead);
     }
     deleteFcgNodeInfo(inf(v));

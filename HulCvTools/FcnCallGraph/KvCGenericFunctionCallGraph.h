@@ -140,17 +140,17 @@ private:
       kCall        // enter `call` through addCall (it has an end missing)
     };
     Kind kind;
-    bool selfCall;
+    bool selfCall = false;
     // Debug indices of the calling and the called symbol (kNode: of `function`), or -1;
     // they key the node cache of a construction run.
-    int callingIndex;
-    int calledIndex;
-    KvCFcgFunctionInfo* calling;
-    KvCFcgFunctionInfo* called;
-    KvCParamSymbol* function;
-    KvCCallOperation* call;
-    leda::node v; // the calling and called node of a kEdge record, once registered
-    leda::node w;
+    int callingIndex = -1;
+    int calledIndex = -1;
+    KvCFcgFunctionInfo* calling = nullptr;
+    KvCFcgFunctionInfo* called = nullptr;
+    KvCParamSymbol* function = nullptr;
+    KvCCallOperation* call = nullptr;
+    leda::node v = nullptr; // the calling and called node of a kEdge record, once registered
+    leda::node w = nullptr;
   };
   // Records what `use` asks for.
   void recordUse(KV_ExprLocation* use);

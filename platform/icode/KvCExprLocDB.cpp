@@ -1,15 +1,17 @@
 #include "platform/icode/KvCExprLocDB.h"
-#include "platform/support/KvCPrefetch.h"
 
 #include "platform/icode/KV_ExprLocation.h"
 #include "platform/icode/KV_Operation.h"
 #include "platform/icode/KV_Statement.h"
 #include "platform/icode/KvCCStmTable.h"
 #include "platform/icode/KvCParamSymbol.h"
+#include "platform/support/KvCPrefetch.h"
 
 #include <algorithm>
 
-KvCExprLocDB::KvCExprLocDB() : qsoPart(this) { std::fill(std::begin(lastSerial), std::end(lastSerial), -1); }
+KvCExprLocDB::KvCExprLocDB() : qsoPart(this) {
+  std::fill(std::begin(lastSerial), std::end(lastSerial), -1);
+}
 
 KvCExprLocDB::~KvCExprLocDB() { clear(); }
 

@@ -1,5 +1,4 @@
 #include "platform/icode/KvCICodeIterator.h"
-#include "platform/support/KvCPrefetch.h"
 
 #include "platform/icode/KV_Constant.h"
 #include "platform/icode/KV_ExprLocation.h"
@@ -12,6 +11,7 @@
 #include "platform/icode/KvCIcFileId.h"
 #include "platform/icode/KvCSmbInitValExpr.h"
 #include "platform/icode/KvCStringExpr.h"
+#include "platform/support/KvCPrefetch.h"
 
 KV_ICodeElemVisitor::~KV_ICodeElemVisitor() = default;
 void KV_ICodeElemVisitor::visitOperation(KV_Operation*) {}

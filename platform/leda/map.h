@@ -120,11 +120,6 @@ public:
   }
 
   bool defined(const K& k) const { return findSlot(k, hashOf(k)) != kNoSlot; }
-  // The value of k, or null when k is undefined; never defines.
-  const V* lookup(const K& k) const {
-    const std::size_t found = findSlot(k, hashOf(k));
-    return found == kNoSlot ? nullptr : &entryAt(slots_[found].entry).kv->second;
-  }
 
   // Cache hints for a lookup of k to come: its home slot, then (once the slots are
   // cached) the first entry whose hash matches. Neither reads an entry.

@@ -9,7 +9,6 @@
 #define HULCVTOOLS_PLATFORM_LEDA_SET_H
 
 #include "platform/leda/compare.h"
-#include "platform/support/KvCPrefetch.h"
 
 #include <cassert>
 #include <iterator>
@@ -75,16 +74,6 @@ public:
     if (last_ == items_.end() || less(*last_, x))
       last_ = finger_;
     return true;
-  }
-  // Cache hint for an insertion to come: the element the last insertion ended at.
-  void prefetch_finger() const {
-    if (finger_ != items_.end())
-      KvCPrefetch::read(&*finger_);
-  }
-  // The next hint, once the finger's element is cached: the element after it.
-  void prefetch_after_finger() const {
-    if (finger_ != items_.end() && finger_ != last_)
-      KvCPrefetch::read(&*std::next(finger_));
   }
   // Returns false if no equal element was present.
   bool del(const T& x) {
