@@ -4,11 +4,13 @@
 #include "HulCvTools/Control/KvCObjectPool.h"
 #include "HulCvTools/FcnCallGraph/KvCFcgQuery.h"
 #include "HulCvTools/FcnCallGraph/KvCFcnSmbVisitor.h"
+#include "HulCvTools/FcnCallGraph/KvCFunctionCallGraph.h"
 #include "HulCvTools/ModelInterfaces/ICodeModel.h"
 #include "platform/support/KvCPrefetch.h"
 
 #include <algorithm>
 #include <cstdint>
+#include <typeinfo>
 
 // The graph type every call graph of the library derives from, instantiated and exported
 // here once.
@@ -94,9 +96,51 @@ public:
     --count;
   }
 
+  // Empties the index; the table's memory is kept for the next fill.
   void clear() {
-    slots.assign(slots.size(), Slot{});
+    slots.clear();
     count = 0;
+  }
+
+  // Refills the index with every edge of the graph, hidden ones included. The entries go
+  // in in the order of their home slots (a counting sort by the slots' high bits), so the
+  // table is written front to back instead of at random: O(edges), cache friendly.
+  void rebuild() {
+    clear();
+    std::size_t edges = 0;
+    for (leda::edge e : graph.all_edges()) {
+      (void)e;
+      ++edges;
+    }
+    std::size_t size = 64;
+    while ((edges + 1) * 4 > size * 3)
+      size *= 2;
+    slots.assign(size, Slot{});
+    // Buckets of about 16 slots each.
+    const std::size_t buckets = std::max<std::size_t>(size / 16, 1);
+    const std::size_t shift = static_cast<std::size_t>(__builtin_ctzll(size / buckets));
+    std::vector<std::uint32_t> start(buckets + 1, 0);
+    pending.resize(edges);
+    std::size_t k = 0;
+    for (leda::edge e : graph.all_edges()) {
+      const auto h = static_cast<std::uint32_t>(home(graph.source(e), graph.target(e)));
+      pending[k++] = Pending{h, e};
+      ++start[(h >> shift) + 1];
+    }
+    for (std::size_t b = 1; b <= buckets; ++b)
+      start[b] += start[b - 1];
+    sorted.resize(edges);
+    for (const Pending& p : pending)
+      sorted[start[p.home >> shift]++] = p;
+    for (const Pending& p : sorted) {
+      std::size_t i = p.home;
+      while (slots[i].e)
+        i = next(i);
+      slots[i] = Slot{graph.source(p.e), graph.target(p.e), p.e};
+    }
+    count = edges;
+    pending.clear();
+    sorted.clear();
   }
 
   // Cache hint for a lookup or insertion of the pair to come.
@@ -132,9 +176,17 @@ private:
         insert(s.v, s.w, s.e);
   }
 
+  struct Pending {
+    std::uint32_t home;
+    leda::edge e;
+  };
+
   const KvCFcgGraph& graph;
   std::vector<Slot> slots;
   std::size_t count = 0;
+  // Scratch of rebuild, kept for the next one.
+  std::vector<Pending> pending;
+  std::vector<Pending> sorted;
 };
 
 KvCGenericFunctionCallGraph::KvCGenericFunctionCallGraph()
@@ -171,86 +223,6 @@ private:
   bool visitAllSymbols;
 };
 
-// Walks a group of uses up the model far enough to know each call's calling function
-// info, issuing a prefetch at every step. The uses of one group are independent, so
-// their cache misses overlap instead of being taken one after another when the calls are
-// entered. Only a hint: the entering code asks the model again.
-class KvCUsePrefetcher {
-public:
-  static constexpr std::size_t kGroup = 32;
-
-  void run(KV_ExprLocation* const* uses, std::size_t n) {
-    for (std::size_t j = 0; j < n; ++j) {
-      const KV_ExprLocation* use = uses[j];
-      KvCPrefetch::read(use->getExpression());
-      cursor[j] = use->getParent();
-      KvCPrefetch::read(cursor[j]);
-      state[j] = kCall;
-    }
-    for (int round = 0; round < kRounds; ++round)
-      for (std::size_t j = 0; j < n; ++j)
-        step(j);
-  }
-
-private:
-  enum State : unsigned char { kCall, kHolder, kStatement, kTable, kSymbol, kDone };
-  static constexpr int kRounds = 8;
-
-  void step(std::size_t j) {
-    KV_ICodeElem* e = cursor[j];
-    if (!e) {
-      state[j] = kDone;
-      return;
-    }
-    switch (state[j]) {
-    case kCall: {
-      KV_Operation* op = e->asOperation();
-      KvCCallOperation* call = op ? op->asCallOperation() : nullptr;
-      if (call && call->isCallingSymbolKnown()) {
-        symbols[j] = call->getCallingSymbol();
-        KvCPrefetch::read(symbols[j]);
-        state[j] = symbols[j] ? kSymbol : kDone;
-        break;
-      }
-      advance(j, call ? call->getParent() : nullptr, kHolder);
-      break;
-    }
-    case kHolder:
-      advance(j, e->getParentElem(), kStatement);
-      break;
-    case kStatement:
-      if (KV_Statement* statement = e->asStatement())
-        advance(j, statement->getParentCTable(), kTable);
-      else
-        advance(j, e->getParentElem(), kStatement);
-      break;
-    case kTable: {
-      KvCParamSymbol* symbol = static_cast<KvCCStmTable*>(e)->getCodeBlockSymbol();
-      KvCPrefetch::read(symbol);
-      symbols[j] = symbol;
-      state[j] = symbol ? kSymbol : kDone;
-      break;
-    }
-    case kSymbol:
-      KvCPrefetch::read(symbols[j]->getFunctionInfo());
-      state[j] = kDone;
-      break;
-    case kDone:
-      break;
-    }
-  }
-
-  void advance(std::size_t j, KV_ICodeElem* next, State s) {
-    KvCPrefetch::read(next);
-    cursor[j] = next;
-    state[j] = next ? s : kDone;
-  }
-
-  KV_ICodeElem* cursor[kGroup] = {};
-  KvCParamSymbol* symbols[kGroup] = {};
-  State state[kGroup] = {};
-};
-
 } // namespace
 
 bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
@@ -269,6 +241,14 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
   // Debug indices beyond a few times the number of symbols are looked up in the map.
   nodeCache.assign(static_cast<std::size_t>(data->getSymbolDB()->getNumberOfSymbols()) * 2 + 1024,
                    nullptr);
+  // Edges are found through the group table while the run lasts; the edge index is filled
+  // once at its end.
+  edgeIndexCurrent = false;
+  constructing = true;
+  // The library's own graphs keep the base's edge hook, whose whole work (the task mark)
+  // construction then does itself from what it read with the rest of the call.
+  plainEdgeHook = typeid(*this) == typeid(KvCGenericFunctionCallGraph) ||
+                  typeid(*this) == typeid(KvCFunctionCallGraph);
   std::size_t listed = 0;
   for (;;) {
     std::vector<KvCParamSymbol*> functions;
@@ -279,8 +259,14 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
     listed = collector.visited;
     treatFcnSymbols(functions);
   }
+  flushGroupCalls();
+  constructing = false;
+  groupNode = nullptr;
+  groupInfo = nullptr;
   addDeferredCalledFcns();
+  ensureEdgeIndex();
   nodeCache = std::vector<leda::node>();
+  useRecords = std::vector<UseRecord>();
   return !incomplete;
 }
 
@@ -301,12 +287,11 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
     useBuffer.insert(useBuffer.end(), listedUses.begin(), listedUses.end());
   }
   starts.push_back(useBuffer.size());
+  resolveUses();
 
   // The records are carried out in batches small enough to stay in the cache.
   constexpr std::size_t kBatch = 2048;
   steps.clear();
-  KvCUsePrefetcher prefetcher;
-  std::size_t prefetched = 0;
   for (std::size_t f = 0; f < count; ++f) {
     if (f + 8 < count)
       KvCPrefetch::read(functions[f + 8]);
@@ -314,52 +299,152 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
     KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
     if (!info)
       continue;
+    const int index = function->getDebugIndex();
     steps.push_back(Step{.kind = Step::kNode,
-                         .callingIndex = function->getDebugIndex(),
+                         .callingIndex = index,
+                         .groupUses = starts[f + 1] - starts[f],
                          .calling = info,
                          .function = function});
-    for (std::size_t u = starts[f]; u < starts[f + 1]; ++u) {
-      // The prefetcher stays a group ahead, so its fetches land while the current group
-      // is recorded.
-      while (prefetched < useBuffer.size() && prefetched <= u + KvCUsePrefetcher::kGroup) {
-        const std::size_t n = std::min(KvCUsePrefetcher::kGroup, useBuffer.size() - prefetched);
-        prefetcher.run(useBuffer.data() + prefetched, n);
-        prefetched += n;
-      }
-      recordUse(useBuffer[u]);
-    }
+    for (std::size_t u = starts[f]; u < starts[f + 1]; ++u)
+      pushStep(useRecords[u], function, info, index);
     if (steps.size() >= kBatch)
       replaySteps();
   }
   replaySteps();
 }
 
-void KvCGenericFunctionCallGraph::recordUse(KV_ExprLocation* use) {
-  // As enterUse and addCall decide, without changing the graph.
-  KV_Operation* op = use->getOperation();
-  if (!op) {
+void KvCGenericFunctionCallGraph::pushStep(const UseRecord& record, KvCParamSymbol* function,
+                                           KvCFcgFunctionInfo* info, int index) {
+  switch (record.kind) {
+  case Step::kIncomplete:
     steps.push_back(Step{.kind = Step::kIncomplete});
     return;
-  }
-  KV_Operation* above = op->getParentOperation();
-  KvCCallOperation* call = above ? above->asCallOperation() : nullptr;
-  if (!call)
+  case Step::kCall:
+    steps.push_back(Step{.kind = Step::kCall, .call = record.call});
     return;
-  KvCParamSymbol* calling = call->getCallingSymbol();
-  KvCParamSymbol* called = call->getCalledSymbol();
-  const bool bothEnds = calling && called;
-  KvCFcgFunctionInfo* callingInfo = bothEnds ? provideFcgNodeInfo(calling) : nullptr;
-  KvCFcgFunctionInfo* calledInfo = bothEnds ? provideFcgNodeInfo(called) : nullptr;
-  if (callingInfo && calledInfo)
-    steps.push_back(Step{.kind = Step::kEdge,
-                         .selfCall = calling == called,
-                         .callingIndex = calling->getDebugIndex(),
-                         .calledIndex = called->getDebugIndex(),
-                         .calling = callingInfo,
-                         .called = calledInfo,
-                         .call = call});
-  else
-    steps.push_back(Step{.kind = Step::kCall, .call = call});
+  case Step::kEdge:
+    break;
+  default:
+    return;
+  }
+  // Almost always the called function is the symbol whose uses these are.
+  const bool visited = record.calledSymbol == function;
+  KvCFcgFunctionInfo* called = visited ? info : provideFcgNodeInfo(record.calledSymbol);
+  if (!called) {
+    steps.push_back(Step{.kind = Step::kCall, .call = record.call});
+    return;
+  }
+  steps.push_back(Step{.kind = Step::kEdge,
+                       .selfCall = record.selfCall,
+                       .taskCall = record.taskCall,
+                       .ownCall = visited,
+                       .callingIndex = record.callingIndex,
+                       .calledIndex = visited ? index : record.calledSymbol->getDebugIndex(),
+                       .serial = record.serial,
+                       .calling = record.calling,
+                       .called = called,
+                       .call = record.call,
+                       .v = record.v});
+}
+
+void KvCGenericFunctionCallGraph::sortUsesByAddress() {
+  // A counting sort by address range (about four uses per range): the uses of one range
+  // lie within a few pages of each other.
+  const std::size_t n = useBuffer.size();
+  std::uintptr_t low = UINTPTR_MAX;
+  std::uintptr_t high = 0;
+  for (KV_ExprLocation* use : useBuffer) {
+    const auto a = reinterpret_cast<std::uintptr_t>(use);
+    low = std::min(low, a);
+    high = std::max(high, a);
+  }
+  const std::size_t ranges = std::clamp<std::size_t>(n / 4, 1, std::size_t{1} << 20);
+  unsigned shift = 0;
+  while (((high - low) >> shift) >= ranges)
+    ++shift;
+  const std::size_t buckets = static_cast<std::size_t>((high - low) >> shift) + 1;
+  useRangeStart.assign(buckets + 1, 0);
+  for (KV_ExprLocation* use : useBuffer)
+    ++useRangeStart[((reinterpret_cast<std::uintptr_t>(use) - low) >> shift) + 1];
+  for (std::size_t b = 1; b <= buckets; ++b)
+    useRangeStart[b] += useRangeStart[b - 1];
+  useOrder.resize(n);
+  for (std::size_t i = 0; i < n; ++i) {
+    const std::uintptr_t a = reinterpret_cast<std::uintptr_t>(useBuffer[i]) - low;
+    useOrder[useRangeStart[a >> shift]++] = static_cast<std::uint32_t>(i);
+  }
+}
+
+void KvCGenericFunctionCallGraph::resolveUses() {
+  // What each use asks for, as enterUse and addCall decide, read from the model in the
+  // order the uses lie in memory: uses that lie together (the calls of one body) are read
+  // together, and the calling function changes only from body to body.
+  const std::size_t n = useBuffer.size();
+  useRecords.resize(n);
+  if (n == 0)
+    return;
+  sortUsesByAddress();
+  constexpr std::size_t kFar = 16;
+  constexpr std::size_t kNear = 8;
+  KvCParamSymbol* lastCalling = nullptr;
+  KvCFcgFunctionInfo* callingInfo = nullptr;
+  int callingIndex = -1;
+  leda::node callingNode = nullptr;
+  for (std::size_t k = 0; k < n; ++k) {
+    if (k + kFar < n)
+      KvCPrefetch::read(useBuffer[useOrder[k + kFar]]);
+    if (k + kNear < n) {
+      const KV_ExprLocation* ahead = useBuffer[useOrder[k + kNear]];
+      KvCPrefetch::read(ahead->getExpression());
+      KvCPrefetch::read(ahead->getParent());
+    }
+    UseRecord& record = useRecords[useOrder[k]];
+    KV_Operation* op = useBuffer[useOrder[k]]->getOperation();
+    if (!op) {
+      record = UseRecord{.kind = Step::kIncomplete};
+      continue;
+    }
+    KV_Operation* above = op->getParentOperation();
+    KvCCallOperation* call = above ? above->asCallOperation() : nullptr;
+    if (!call) {
+      record = UseRecord{};
+      continue;
+    }
+    KvCParamSymbol* calling = call->getCallingSymbol();
+    KvCParamSymbol* called = call->getCalledSymbol();
+    if (calling && calling != lastCalling) {
+      lastCalling = calling;
+      callingInfo = provideFcgNodeInfo(calling);
+      callingIndex = calling->getDebugIndex();
+      callingNode = callingInfo ? existingNodeOf(callingInfo, callingIndex) : nullptr;
+    }
+    if (!calling || !called || !callingInfo) {
+      record = UseRecord{.kind = Step::kCall, .call = call};
+      continue;
+    }
+    record = UseRecord{.kind = Step::kEdge,
+                       .selfCall = calling == called,
+                       .taskCall = call->isTaskActivation(),
+                       .callingIndex = callingIndex,
+                       .serial = call->getSerial(),
+                       .call = call,
+                       .calling = callingInfo,
+                       .calledSymbol = called,
+                       .v = callingNode};
+  }
+}
+
+leda::node KvCGenericFunctionCallGraph::existingNodeOf(KvCFcgFunctionInfo* function, int index) {
+  const auto slot = static_cast<std::size_t>(index);
+  const bool cacheable = index >= 0 && slot < nodeCache.size();
+  if (cacheable && nodeCache[slot] && inf(nodeCache[slot]) == function)
+    return nodeCache[slot];
+  if (!nodes.defined(function))
+    return nullptr;
+  const leda::node v = nodes[function];
+  if (cacheable)
+    nodeCache[slot] = v;
+  return v;
 }
 
 void KvCGenericFunctionCallGraph::replaySteps() {
@@ -377,10 +462,11 @@ void KvCGenericFunctionCallGraph::replaySteps() {
       prefetchNodes(steps[i + kNear], true);
     Step& step = steps[i];
     if (step.kind == Step::kNode) {
-      cachedNodeOf(step.calling, step.callingIndex);
+      step.v = cachedNodeOf(step.calling, step.callingIndex);
       synchronizeNodeInfoAtConstruction(step.calling, step.function);
     } else if (step.kind == Step::kEdge) {
-      step.v = cachedNodeOf(step.calling, step.callingIndex);
+      if (!step.v)
+        step.v = cachedNodeOf(step.calling, step.callingIndex);
       step.w = cachedNodeOf(step.called, step.calledIndex);
     }
   }
@@ -392,6 +478,7 @@ void KvCGenericFunctionCallGraph::replaySteps() {
     const Step& step = steps[i];
     switch (step.kind) {
     case Step::kNode:
+      beginGroup(step.v, step.calling, step.groupUses);
       break;
     case Step::kIncomplete:
       incomplete = true;
@@ -401,6 +488,8 @@ void KvCGenericFunctionCallGraph::replaySteps() {
       break;
     case Step::kCall:
       addCall(step.call);
+      break;
+    default:
       break;
     }
   }
@@ -420,7 +509,8 @@ leda::node KvCGenericFunctionCallGraph::cachedNodeOf(KvCFcgFunctionInfo* functio
 void KvCGenericFunctionCallGraph::prefetchNodes(const Step& step, bool near) const {
   if (step.kind != Step::kNode && step.kind != Step::kEdge)
     return;
-  const int indices[2] = {step.callingIndex, step.kind == Step::kEdge ? step.calledIndex : -1};
+  const int indices[2] = {step.v ? -1 : step.callingIndex,
+                          step.kind == Step::kEdge ? step.calledIndex : -1};
   for (int index : indices) {
     const auto slot = static_cast<std::size_t>(index);
     if (index < 0 || slot >= nodeCache.size())
@@ -448,28 +538,139 @@ void KvCGenericFunctionCallGraph::prefetchEdge(const Step& step, bool near) cons
   if (step.kind != Step::kEdge)
     return;
   if (!near) {
-    edgeIndex->prefetch(step.v, step.w);
     prefetch_node(step.v);
-    prefetch_node(step.w);
-    KvCPrefetch::read(step.called);
-    KvCPrefetch::read(step.call);
+    if (!plainEdgeHook || !step.ownCall)
+      KvCPrefetch::read(step.call);
     return;
   }
   prefetch_out_end(step.v);
-  step.called->getCallOperationsSet().prefetch();
 }
 
 void KvCGenericFunctionCallGraph::enterEdge(const Step& step) {
   // addCall once both infos are known.
-  leda::edge e = nullptr;
-  addEdgeBetween(step.v, step.w, e);
-  synchronizeEdgeInfoAtConstruction(inf(e), step.call);
-  step.called->addCallOperation(step.call);
+  leda::edge e = findConstructedEdge(step.v, step.w);
+  if (e) {
+    if (KvCFcgEdgeInfo* info = inf(e))
+      info->incCardinality();
+  } else {
+    e = linkNewEdge(step.v, step.w);
+  }
+  if (!plainEdgeHook)
+    synchronizeEdgeInfoAtConstruction(inf(e), step.call);
+  else if (step.taskCall && inf(e))
+    inf(e)->setIsTaskCall(true);
+  // The group's calls go to its function's set together, from the serials read before.
+  if (step.ownCall && step.called == groupInfo) {
+    groupCalls.push_back(step.call);
+    groupSerials.push_back(step.serial);
+  } else {
+    step.called->addCallOperation(step.call);
+  }
   if (!step.selfCall) {
     const KvCFcgCalledFunction called = step.called->asCalledFunction();
     deferredCalled.push_back(
         DeferredCalled{index(step.v), called.debugIndex, step.calling, called.symbol});
   }
+}
+
+// --- edges while constructing
+
+void KvCGenericFunctionCallGraph::flushGroupCalls() {
+  if (groupInfo && !groupCalls.empty())
+    groupInfo->addCallOperations(groupCalls.data(), groupSerials.data(), groupCalls.size());
+  groupCalls.clear();
+  groupSerials.clear();
+}
+
+void KvCGenericFunctionCallGraph::beginGroup(leda::node w, KvCFcgFunctionInfo* info,
+                                             std::size_t uses) {
+  // The table holds every edge into w: those made before (by calls that reached w through
+  // another symbol's uses) are entered now, those made during the group as they are made.
+  flushGroupCalls();
+  groupInfo = info;
+  groupNode = w;
+  const std::size_t expected = uses + static_cast<std::size_t>(indeg(w));
+  std::size_t size = 8;
+  while (size < expected * 2 + 2)
+    size *= 2;
+  groupSlots.assign(size, GroupSlot{});
+  groupCount = 0;
+  for (leda::edge e : in_edges(w))
+    if (!groupFind(source(e)))
+      groupInsert(source(e), e);
+}
+
+std::size_t KvCGenericFunctionCallGraph::groupHome(leda::node v) const {
+  const auto a = reinterpret_cast<std::uintptr_t>(v);
+  return static_cast<std::size_t>(((a >> 4) * 0x9e3779b97f4a7c15ULL) >> 20) &
+         (groupSlots.size() - 1);
+}
+
+leda::edge KvCGenericFunctionCallGraph::groupFind(leda::node v) const {
+  for (std::size_t i = groupHome(v);; i = (i + 1) & (groupSlots.size() - 1)) {
+    const GroupSlot& s = groupSlots[i];
+    if (!s.v || s.v == v)
+      return s.e;
+  }
+}
+
+void KvCGenericFunctionCallGraph::groupInsert(leda::node v, leda::edge e) {
+  if ((groupCount + 1) * 2 > groupSlots.size()) {
+    std::vector<GroupSlot> old = std::move(groupSlots);
+    groupSlots.assign(old.size() * 2, GroupSlot{});
+    groupCount = 0;
+    for (const GroupSlot& s : old)
+      if (s.v)
+        groupInsert(s.v, s.e);
+  }
+  std::size_t i = groupHome(v);
+  while (groupSlots[i].v)
+    i = (i + 1) & (groupSlots.size() - 1);
+  groupSlots[i] = GroupSlot{v, e};
+  ++groupCount;
+}
+
+leda::edge KvCGenericFunctionCallGraph::findConstructedEdge(leda::node v, leda::node w) {
+  if (w == groupNode)
+    return groupFind(v);
+  if (edgeIndexCurrent)
+    return edgeIndex->find(v, w);
+  // A call reached through another symbol's uses (a function passed as an argument): the
+  // shorter of the two edge lists is scanned; beyond a few edges the index is filled.
+  constexpr int kScanLimit = 32;
+  if (std::min(outdeg(v), indeg(w)) > kScanLimit) {
+    ensureEdgeIndex();
+    return edgeIndex->find(v, w);
+  }
+  if (outdeg(v) <= indeg(w)) {
+    for (leda::edge e : out_edges(v))
+      if (target(e) == w)
+        return e;
+    return nullptr;
+  }
+  for (leda::edge e : in_edges(w))
+    if (source(e) == v)
+      return e;
+  return nullptr;
+}
+
+leda::edge KvCGenericFunctionCallGraph::linkNewEdge(leda::node v, leda::node w) {
+  KvCFcgEdgeInfo* info = createFcgEdgeInfo();
+  const leda::edge e = new_edge(v, w, info);
+  if (edgeIndexCurrent)
+    edgeIndex->insert(v, w, e);
+  if (constructing && w == groupNode)
+    groupInsert(v, e);
+  if (info)
+    info->incCardinality();
+  return e;
+}
+
+void KvCGenericFunctionCallGraph::ensureEdgeIndex() const {
+  if (edgeIndexCurrent)
+    return;
+  edgeIndex->rebuild();
+  edgeIndexCurrent = true;
 }
 
 void KvCGenericFunctionCallGraph::addDeferredCalledFcns() {
@@ -564,6 +765,8 @@ bool KvCGenericFunctionCallGraph::addCall(KvCCallOperation* call) {
 }
 
 bool KvCGenericFunctionCallGraph::delCall(KvCCallOperation* call) {
+  if (constructing)
+    flushGroupCalls();
   KvCParamSymbol* calling = call ? call->getCallingSymbol() : nullptr;
   KvCParamSymbol* called = call ? call->getCalledSymbol() : nullptr;
   if (!calling || !called)
@@ -593,17 +796,14 @@ bool KvCGenericFunctionCallGraph::addEdge(KvCFcgFunctionInfo* calling, KvCFcgFun
 }
 
 bool KvCGenericFunctionCallGraph::addEdgeBetween(leda::node v, leda::node w, leda::edge& e) {
+  ensureEdgeIndex();
   if (leda::edge existing = edgeIndex->find(v, w)) {
     e = existing;
     if (KvCFcgEdgeInfo* info = inf(e))
       info->incCardinality();
     return false;
   }
-  KvCFcgEdgeInfo* info = createFcgEdgeInfo();
-  e = new_edge(v, w, info);
-  edgeIndex->insert(v, w, e);
-  if (info)
-    info->incCardinality();
+  e = linkNewEdge(v, w);
   return true;
 }
 
@@ -634,6 +834,7 @@ bool KvCGenericFunctionCallGraph::getEdge(KvCFcgFunctionInfo* calling, KvCFcgFun
   leda::node w = nullptr;
   if (!getNode(calling, v) || !getNode(called, w))
     return false;
+  ensureEdgeIndex();
   leda::edge found = edgeIndex->find(v, w);
   if (!found)
     return false;
@@ -654,7 +855,11 @@ int KvCGenericFunctionCallGraph::getNrOfCalled(KvCFcgFunctionInfo* function) con
 // --- removal
 
 void KvCGenericFunctionCallGraph::deleteEdge(leda::edge e) {
+  ensureEdgeIndex();
   edgeIndex->erase(source(e), target(e), e);
+  // A hook deleting edges while construct runs: the group table may hold this edge, so
+  // the rest of the group looks its edges up as other calls do.
+  groupNode = nullptr;
   deleteFcgEdgeInfo(inf(e));
   del_edge(e);
 }
@@ -688,6 +893,8 @@ void KvCGenericFunctionCallGraph::deleteAllEdges() {
     deleteFcgEdgeInfo(inf(e));
   del_all_edges();
   edgeIndex->clear();
+  edgeIndexCurrent = true;
+  groupNode = nullptr;
 }
 
 void KvCGenericFunctionCallGraph::deleteAllNodes() {

@@ -38,6 +38,8 @@
 #include "platform/leda/map.h"
 #include "platform/leda/set.h"
 
+#include <cstddef>
+#include <cstdint>
 #include <memory>
 #include <vector>
 
@@ -137,14 +139,19 @@ private:
       kNode,       // register `calling` (the info of `function`) and synchronize it
       kIncomplete, // a use without operation
       kEdge,       // enter `call` from `calling` to `called`, both known
-      kCall        // enter `call` through addCall (it has an end missing)
+      kCall,       // enter `call` through addCall (it has an end missing)
+      kNone        // (use records only) the use is no operand of a call
     };
     Kind kind;
     bool selfCall = false;
+    bool taskCall = false; // kEdge: the call activates a task
+    bool ownCall = false;  // kEdge: `called` is the function whose uses these are
     // Debug indices of the calling and the called symbol (kNode: of `function`), or -1;
     // they key the node cache of a construction run.
     int callingIndex = -1;
     int calledIndex = -1;
+    int serial = 0;            // kEdge: the call's serial number
+    std::size_t groupUses = 0; // kNode: the number of uses of `function`
     KvCFcgFunctionInfo* calling = nullptr;
     KvCFcgFunctionInfo* called = nullptr;
     KvCParamSymbol* function = nullptr;
@@ -152,8 +159,28 @@ private:
     leda::node v = nullptr; // the calling and called node of a kEdge record, once registered
     leda::node w = nullptr;
   };
-  // Records what `use` asks for.
-  void recordUse(KV_ExprLocation* use);
+  // What one use asks for, read from the model before the steps are made (kEdge: `v` is
+  // the calling node if it existed already; kCall: only `call`).
+  struct UseRecord {
+    Step::Kind kind = Step::kNone;
+    bool selfCall = false;
+    bool taskCall = false;
+    int callingIndex = -1;
+    int serial = 0;
+    KvCCallOperation* call = nullptr;
+    KvCFcgFunctionInfo* calling = nullptr;
+    KvCParamSymbol* calledSymbol = nullptr;
+    leda::node v = nullptr;
+  };
+  // Fills useRecords for useBuffer, reading the uses in address order.
+  void resolveUses();
+  // useOrder: the indices of useBuffer grouped by the address range of their use.
+  void sortUsesByAddress();
+  // The step a use record of `function` (whose info and debug index are given) makes.
+  void pushStep(const UseRecord& record, KvCParamSymbol* function, KvCFcgFunctionInfo* info,
+                int index);
+  // The function's node if it has one (through the node cache), else null.
+  leda::node existingNodeOf(KvCFcgFunctionInfo* function, int index);
   // Carries out the recorded steps in order and forgets them.
   void replaySteps();
   void prefetchNodes(const Step& step, bool near) const;
@@ -164,6 +191,20 @@ private:
   // addEdge between registered nodes.
   bool addEdgeBetween(leda::node v, leda::node w, leda::edge& e);
   void enterEdge(const Step& step);
+  // Creates the edge v -> w with a new info of cardinality 1, entering it in the edge index
+  // (when current) and in the group table (when w is the group's node).
+  leda::edge linkNewEdge(leda::node v, leda::node w);
+  // While constructing: the edge v -> w, or null.
+  leda::edge findConstructedEdge(leda::node v, leda::node w);
+  // Starts the uses of the function whose node is w (`uses` of them).
+  void beginGroup(leda::node w, KvCFcgFunctionInfo* info, std::size_t uses);
+  // Adds the group's calls to its function's set of call operations.
+  void flushGroupCalls();
+  std::size_t groupHome(leda::node v) const;
+  leda::edge groupFind(leda::node v) const;
+  void groupInsert(leda::node v, leda::edge e);
+  // Fills the edge index from the graph when construction left it behind.
+  void ensureEdgeIndex() const;
   // Adds the called functions that construction deferred, grouped by calling function.
   void addDeferredCalledFcns();
 
@@ -176,6 +217,9 @@ private:
   leda::map<KvCFcgFunctionInfo*, leda::node> nodes;
   bool incomplete = true;
   std::unique_ptr<KvCFcgEdgeIndex> edgeIndex;
+  // False while construct runs (the index is filled at its end); every other operation
+  // that uses the index fills it first when it is false.
+  mutable bool edgeIndexCurrent = true;
   // Storage of the edge infos the base hook makes (the destructor deletes every info
   // before the pool goes).
   std::unique_ptr<KvCObjectPool> edgeInfoPool;
@@ -183,6 +227,26 @@ private:
   std::vector<KV_ExprLocation*> useBuffer;
   std::vector<KV_ExprLocation*> listedUses;
   std::vector<Step> steps;
+  std::vector<UseRecord> useRecords;
+  std::vector<std::uint32_t> useOrder;
+  std::vector<std::uint32_t> useRangeStart;
+  // While constructing, the edges into the node of the function whose uses are being
+  // entered (groupNode), by calling node: most calls find their edge here, in a table the
+  // size of the function's uses, instead of in the index.
+  struct GroupSlot {
+    leda::node v = nullptr;
+    leda::edge e = nullptr;
+  };
+  bool constructing = false;
+  // The graph's edge hook is the base's (see construct).
+  bool plainEdgeHook = false;
+  leda::node groupNode = nullptr;
+  KvCFcgFunctionInfo* groupInfo = nullptr;
+  // The group's calls to its function, with their serial numbers, not yet in its set.
+  std::vector<KvCCallOperation*> groupCalls;
+  std::vector<int> groupSerials;
+  std::vector<GroupSlot> groupSlots;
+  std::size_t groupCount = 0;
   // During construction: nodes by symbol debug index, checked against their info before
   // use. Most calls find their calling function here instead of in the node map.
   std::vector<leda::node> nodeCache;

@@ -45,6 +45,11 @@ public:
   CalledFunctionSet& getCalledFunctionsSet() { return calledFunctions; }
   // Each answers whether the set changed.
   bool addCallOperation(KvCCallOperation* call);
+  // Adds n call operations given with their serial numbers, as n addCallOperation calls
+  // would. When the serials ascend strictly and follow the set's greatest element the
+  // calls are appended without reading them (one read of that element); otherwise they
+  // are inserted one by one.
+  void addCallOperations(KvCCallOperation* const* calls, const int* serials, std::size_t n);
   bool delCallOperation(KvCCallOperation* call);
   bool addCalledFcn(KvCFcgFunctionInfo* called);
   // The same for a called function already in its set form (see asCalledFunction); a null

@@ -97,6 +97,25 @@ public:
     return true;
   }
 
+  // Appends n elements that the caller knows to be strictly ascending and greater than
+  // every element of the set, without comparing them (a refill from sorted data whose
+  // order keys are known elsewhere). O(n) amortized.
+  void appendAscending(const T* first, std::size_t n) {
+    if (!tree) {
+      items.insert(items.end(), first, first + n);
+      if (!items.empty())
+        last = items.size() - 1;
+      if (items.size() > kFlatLimit)
+        moveToTree();
+      return;
+    }
+    for (std::size_t i = 0; i < n; ++i)
+      finger = tree->insert(tree->end(), first[i]);
+  }
+
+  // The greatest element; the set must not be empty.
+  const T& back() const { return tree ? *tree->rbegin() : items.back(); }
+
   // Returns false if no equal element was present.
   bool del(const T& x) {
     if (tree) {
