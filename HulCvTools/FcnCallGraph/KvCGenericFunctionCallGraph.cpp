@@ -239,8 +239,9 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
   // in one sequence, so that prefetching runs ahead across symbol boundaries (a scheduler's
   // callees have one use each). Symbols made while treating are listed by a further walk.
   // Debug indices beyond a few times the number of symbols are looked up in the map.
-  nodeCache.assign(static_cast<std::size_t>(data->getSymbolDB()->getNumberOfSymbols()) * 2 + 1024,
-                   nullptr);
+  functionSlots.assign(
+      static_cast<std::size_t>(data->getSymbolDB()->getNumberOfSymbols()) * 2 + 1024,
+      FunctionSlot{});
   // Edges are found through the group table while the run lasts; the edge index is filled
   // once at its end.
   edgeIndexCurrent = false;
@@ -265,7 +266,7 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
   groupInfo = nullptr;
   addDeferredCalledFcns();
   ensureEdgeIndex();
-  nodeCache = std::vector<leda::node>();
+  functionSlots = std::vector<FunctionSlot>();
   useRecords = std::vector<UseRecord>();
   return !incomplete;
 }
@@ -287,6 +288,7 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
     useBuffer.insert(useBuffer.end(), listedUses.begin(), listedUses.end());
   }
   starts.push_back(useBuffer.size());
+  fillFunctionSlots(functions);
   resolveUses();
 
   // The records are carried out in batches small enough to stay in the cache.
@@ -296,10 +298,11 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
     if (f + 8 < count)
       KvCPrefetch::read(functions[f + 8]);
     KvCParamSymbol* function = functions[f];
-    KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
+    const int index = function->getDebugIndex();
+    const FunctionSlot* slot = slotOf(function, index);
+    KvCFcgFunctionInfo* info = slot ? slot->info : provideFcgNodeInfo(function);
     if (!info)
       continue;
-    const int index = function->getDebugIndex();
     steps.push_back(Step{.kind = Step::kNode,
                          .callingIndex = index,
                          .groupUses = starts[f + 1] - starts[f],
@@ -371,7 +374,7 @@ void KvCGenericFunctionCallGraph::sortUsesByAddress() {
   useOrder.resize(n);
   for (std::size_t i = 0; i < n; ++i) {
     const std::uintptr_t a = reinterpret_cast<std::uintptr_t>(useBuffer[i]) - low;
-    useOrder[useRangeStart[a >> shift]++] = static_cast<std::uint32_t>(i);
+    useOrder[useRangeStart[a >> shift]++] = SortedUse{useBuffer[i], static_cast<std::uint32_t>(i)};
   }
 }
 
@@ -386,20 +389,27 @@ void KvCGenericFunctionCallGraph::resolveUses() {
   sortUsesByAddress();
   constexpr std::size_t kFar = 16;
   constexpr std::size_t kNear = 8;
+  constexpr std::size_t kClose = 4;
   KvCParamSymbol* lastCalling = nullptr;
   KvCFcgFunctionInfo* callingInfo = nullptr;
   int callingIndex = -1;
   leda::node callingNode = nullptr;
   for (std::size_t k = 0; k < n; ++k) {
     if (k + kFar < n)
-      KvCPrefetch::read(useBuffer[useOrder[k + kFar]]);
+      KvCPrefetch::read(useOrder[k + kFar].use);
     if (k + kNear < n) {
-      const KV_ExprLocation* ahead = useBuffer[useOrder[k + kNear]];
+      const KV_ExprLocation* ahead = useOrder[k + kNear].use;
       KvCPrefetch::read(ahead->getExpression());
-      KvCPrefetch::read(ahead->getParent());
+      // The call: all of its lines (serial, called, task and calling function are spread).
+      const char* parent = reinterpret_cast<const char*>(ahead->getParent());
+      KvCPrefetch::read(parent);
+      KvCPrefetch::read(parent + 64);
+      KvCPrefetch::read(parent + 128);
     }
-    UseRecord& record = useRecords[useOrder[k]];
-    KV_Operation* op = useBuffer[useOrder[k]]->getOperation();
+    if (k + kClose < n)
+      prefetchCallingSymbol(useOrder[k + kClose].use);
+    UseRecord& record = useRecords[useOrder[k].index];
+    KV_Operation* op = useOrder[k].use->getOperation();
     if (!op) {
       record = UseRecord{.kind = Step::kIncomplete};
       continue;
@@ -414,9 +424,14 @@ void KvCGenericFunctionCallGraph::resolveUses() {
     KvCParamSymbol* called = call->getCalledSymbol();
     if (calling && calling != lastCalling) {
       lastCalling = calling;
-      callingInfo = provideFcgNodeInfo(calling);
       callingIndex = calling->getDebugIndex();
-      callingNode = callingInfo ? existingNodeOf(callingInfo, callingIndex) : nullptr;
+      if (const FunctionSlot* slot = slotOf(calling, callingIndex)) {
+        callingInfo = slot->info;
+        callingNode = slot->node;
+      } else {
+        callingInfo = provideFcgNodeInfo(calling);
+        callingNode = callingInfo ? existingNodeOf(callingInfo, callingIndex) : nullptr;
+      }
     }
     if (!calling || !called || !callingInfo) {
       record = UseRecord{.kind = Step::kCall, .call = call};
@@ -434,16 +449,52 @@ void KvCGenericFunctionCallGraph::resolveUses() {
   }
 }
 
+void KvCGenericFunctionCallGraph::prefetchCallingSymbol(const KV_ExprLocation* use) {
+  KV_ICodeElem* parent = use->getParent();
+  KV_Operation* op = parent ? parent->asOperation() : nullptr;
+  const KvCCallOperation* call = op ? op->asCallOperation() : nullptr;
+  if (call && call->isCallingSymbolKnown())
+    KvCPrefetch::read(call->getCallingSymbol());
+}
+
+void KvCGenericFunctionCallGraph::fillFunctionSlots(const std::vector<KvCParamSymbol*>& functions) {
+  // Each symbol is fetched kFar places ahead, its map entry kNear places ahead.
+  constexpr std::size_t kFar = 16;
+  constexpr std::size_t kNear = 8;
+  const std::size_t n = functions.size();
+  for (std::size_t f = 0; f < n; ++f) {
+    if (f + kFar < n)
+      KvCPrefetch::read(functions[f + kFar]);
+    if (f + kNear < n)
+      nodes.prefetch_slot(functions[f + kNear]->getFunctionInfo());
+    KvCParamSymbol* function = functions[f];
+    const int index = function->getDebugIndex();
+    const auto slot = static_cast<std::size_t>(index);
+    if (index < 0 || slot >= functionSlots.size())
+      continue;
+    KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
+    functionSlots[slot] = FunctionSlot{function, info, info ? existingNodeOf(info, index) : nullptr};
+  }
+}
+
+const KvCGenericFunctionCallGraph::FunctionSlot*
+KvCGenericFunctionCallGraph::slotOf(const KvCParamSymbol* function, int index) const {
+  const auto slot = static_cast<std::size_t>(index);
+  if (index < 0 || slot >= functionSlots.size() || functionSlots[slot].symbol != function)
+    return nullptr;
+  return &functionSlots[slot];
+}
+
 leda::node KvCGenericFunctionCallGraph::existingNodeOf(KvCFcgFunctionInfo* function, int index) {
   const auto slot = static_cast<std::size_t>(index);
-  const bool cacheable = index >= 0 && slot < nodeCache.size();
-  if (cacheable && nodeCache[slot] && inf(nodeCache[slot]) == function)
-    return nodeCache[slot];
+  const bool cacheable = index >= 0 && slot < functionSlots.size();
+  if (cacheable && functionSlots[slot].node && functionSlots[slot].info == function)
+    return functionSlots[slot].node;
   if (!nodes.defined(function))
     return nullptr;
   const leda::node v = nodes[function];
-  if (cacheable)
-    nodeCache[slot] = v;
+  if (cacheable && functionSlots[slot].info == function)
+    functionSlots[slot].node = v;
   return v;
 }
 
@@ -497,13 +548,16 @@ void KvCGenericFunctionCallGraph::replaySteps() {
 }
 
 leda::node KvCGenericFunctionCallGraph::cachedNodeOf(KvCFcgFunctionInfo* function, int index) {
-  const auto slot = static_cast<std::size_t>(index);
-  if (index < 0 || slot >= nodeCache.size())
+  const auto at = static_cast<std::size_t>(index);
+  if (index < 0 || at >= functionSlots.size())
     return nodeOf(function);
-  leda::node& cached = nodeCache[slot];
-  if (!cached || inf(cached) != function)
-    cached = nodeOf(function);
-  return cached;
+  FunctionSlot& slot = functionSlots[at];
+  if (slot.node && slot.info == function)
+    return slot.node;
+  const leda::node v = nodeOf(function);
+  if (slot.info == function)
+    slot.node = v;
+  return v;
 }
 
 void KvCGenericFunctionCallGraph::prefetchNodes(const Step& step, bool near) const {
@@ -513,12 +567,8 @@ void KvCGenericFunctionCallGraph::prefetchNodes(const Step& step, bool near) con
                           step.kind == Step::kEdge ? step.calledIndex : -1};
   for (int index : indices) {
     const auto slot = static_cast<std::size_t>(index);
-    if (index < 0 || slot >= nodeCache.size())
-      continue;
-    if (!near)
-      KvCPrefetch::read(&nodeCache[slot]);
-    else
-      KvCPrefetch::read(nodeCache[slot]);
+    if (!near && index >= 0 && slot < functionSlots.size())
+      KvCPrefetch::read(&functionSlots[slot]);
   }
   if (step.kind != Step::kNode)
     return;

@@ -174,13 +174,20 @@ private:
   };
   // Fills useRecords for useBuffer, reading the uses in address order.
   void resolveUses();
-  // useOrder: the indices of useBuffer grouped by the address range of their use.
+  // Fills useOrder: the uses of useBuffer grouped by their address range.
   void sortUsesByAddress();
   // The step a use record of `function` (whose info and debug index are given) makes.
   void pushStep(const UseRecord& record, KvCParamSymbol* function, KvCFcgFunctionInfo* info,
                 int index);
-  // The function's node if it has one (through the node cache), else null.
+  // The function's node if it has one (through the function slots), else null.
   leda::node existingNodeOf(KvCFcgFunctionInfo* function, int index);
+  // Enters the listed functions (their infos and existing nodes) in the function slots.
+  void fillFunctionSlots(const std::vector<KvCParamSymbol*>& functions);
+  struct FunctionSlot;
+  // The slot of `function` (debug index `index`), or null when it has none.
+  const FunctionSlot* slotOf(const KvCParamSymbol* function, int index) const;
+  // Cache hint: the calling function of the call above `use`, when known without walking.
+  static void prefetchCallingSymbol(const KV_ExprLocation* use);
   // Carries out the recorded steps in order and forgets them.
   void replaySteps();
   void prefetchNodes(const Step& step, bool near) const;
@@ -228,7 +235,12 @@ private:
   std::vector<KV_ExprLocation*> listedUses;
   std::vector<Step> steps;
   std::vector<UseRecord> useRecords;
-  std::vector<std::uint32_t> useOrder;
+  // The uses sorted by address range, each with its place in useBuffer.
+  struct SortedUse {
+    KV_ExprLocation* use;
+    std::uint32_t index;
+  };
+  std::vector<SortedUse> useOrder;
   std::vector<std::uint32_t> useRangeStart;
   // While constructing, the edges into the node of the function whose uses are being
   // entered (groupNode), by calling node: most calls find their edge here, in a table the
@@ -247,9 +259,16 @@ private:
   std::vector<int> groupSerials;
   std::vector<GroupSlot> groupSlots;
   std::size_t groupCount = 0;
-  // During construction: nodes by symbol debug index, checked against their info before
-  // use. Most calls find their calling function here instead of in the node map.
-  std::vector<leda::node> nodeCache;
+  // During construction, by symbol debug index: the symbol listed with that index, its info
+  // (from provideFcgNodeInfo) and its node once known. A slot serves a symbol only when
+  // it names it, and a node only for the info it names. Most calls find their calling
+  // function here instead of in the node map.
+  struct FunctionSlot {
+    KvCParamSymbol* symbol = nullptr;
+    KvCFcgFunctionInfo* info = nullptr;
+    leda::node node = nullptr;
+  };
+  std::vector<FunctionSlot> functionSlots;
   // Called functions still to be added to their calling function's set: construction adds
   // them calling function by calling function, which loads each set once instead of once
   // per call.
