@@ -123,8 +123,10 @@ public:
     pending.resize(edges);
     std::size_t k = 0;
     for (leda::edge e : graph.all_edges()) {
-      const auto h = static_cast<std::uint32_t>(home(graph.source(e), graph.target(e)));
-      pending[k++] = Pending{h, e};
+      const leda::node v = graph.source(e);
+      const leda::node w = graph.target(e);
+      const auto h = static_cast<std::uint32_t>(home(v, w));
+      pending[k++] = Pending{h, Slot{v, w, e}};
       ++start[(h >> shift) + 1];
     }
     for (std::size_t b = 1; b <= buckets; ++b)
@@ -136,7 +138,7 @@ public:
       std::size_t i = p.home;
       while (slots[i].e)
         i = next(i);
-      slots[i] = Slot{graph.source(p.e), graph.target(p.e), p.e};
+      slots[i] = p.slot;
     }
     count = edges;
     pending.clear();
@@ -178,7 +180,7 @@ private:
 
   struct Pending {
     std::uint32_t home;
-    leda::edge e;
+    Slot slot;
   };
 
   const KvCFcgGraph& graph;
