@@ -241,9 +241,9 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
   // in one sequence, so that prefetching runs ahead across symbol boundaries (a scheduler's
   // callees have one use each). Symbols made while treating are listed by a further walk.
   // Debug indices beyond a few times the number of symbols are looked up in the map.
-  functionSlots.assign(
-      static_cast<std::size_t>(data->getSymbolDB()->getNumberOfSymbols()) * 2 + 1024,
-      FunctionSlot{});
+  functionSlots.assign(static_cast<std::size_t>(data->getSymbolDB()->getNumberOfSymbols()) * 2 +
+                           1024,
+                       FunctionSlot{});
   // Edges are found through the group table while the run lasts; the edge index is filled
   // once at its end.
   edgeIndexCurrent = false;
@@ -475,7 +475,8 @@ void KvCGenericFunctionCallGraph::fillFunctionSlots(const std::vector<KvCParamSy
     if (index < 0 || slot >= functionSlots.size())
       continue;
     KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
-    functionSlots[slot] = FunctionSlot{function, info, info ? existingNodeOf(info, index) : nullptr};
+    functionSlots[slot] =
+        FunctionSlot{function, info, info ? existingNodeOf(info, index) : nullptr};
   }
 }
 

@@ -194,10 +194,10 @@ private:
     items = std::vector<T>();
   }
 
-  std::vector<T> items;       // sorted; holds the elements while the set is small
-  std::unique_ptr<Tree> tree; // holds them once large
+  std::vector<T> items;           // sorted; holds the elements while the set is small
+  std::unique_ptr<Tree> tree;     // holds them once large
   typename Tree::iterator finger; // in the tree: the element the last insertion met, or end
-  std::size_t last = 0;       // where the last flat insertion met its element
+  std::size_t last = 0;           // where the last flat insertion met its element
 };
 
 #endif

@@ -1,10 +1,13 @@
 #include "HulCvTools/FcnCallGraph/KvCGenericFunctionCallGraph.h"
 #include "FcgTestSupport.h"
 #include "HulCvTools/FcnCallGraph/KvCFcgQuery.h"
+#include "HulCvTools/FcnCallGraph/KvCFcnSmbVisitor.h"
 #include "HulCvTools/FcnCallGraph/KvCFunctionCallGraph.h"
 #include "platform/icode/KV_ExprLocationFactory.h"
 #include "platform/icode/KV_ICodeFactoryContainer.h"
 #include "platform/icode/KV_OperationFactory.h"
+#include "platform/icode/KV_SymbolDB.h"
+#include "platform/icode/KvCCodeViewData.h"
 #include "platform/support/KvCSrcRefServer.h"
 
 #include <algorithm>
@@ -413,6 +416,166 @@ TEST_F(GenericCallGraphTest, PairWithTwoEdgesAfterHidingKeepsBothFindable) {
   EXPECT_TRUE(graph.delCall(first));
   EXPECT_TRUE(graph.delCall(second));
   EXPECT_EQ(graph.number_of_edges(), 0);
+}
+
+} // namespace
+
+// --- construct against entering every use one at a time
+
+namespace {
+
+// Builds its graph the plain way: every listed symbol's uses, one addCall each, through the
+// symbol visitor. Its own type also sends construct through the overridable edge hook.
+class OneByOneGraph : public KvCGenericFunctionCallGraph {
+public:
+  void enterUsesOneByOne() {
+    restore_all_edges();
+    deleteAllEdges();
+    deleteAllNodes();
+    KvCFcnSmbVisitor visitor(this, true);
+    KvCCodeViewData::getCurrent()->getSymbolDB()->forallParametrizedSymbols(&visitor);
+  }
+  int edgeHookCalls = 0;
+
+protected:
+  void synchronizeEdgeInfoAtConstruction(KvCFcgEdgeInfo* info, KvCCallOperation* call) override {
+    ++edgeHookCalls;
+    KvCGenericFunctionCallGraph::synchronizeEdgeInfoAtConstruction(info, call);
+  }
+};
+
+// Everything construct decides: node order, edges in order, each node's out- and in-edge
+// order, and the call and called sets of the functions.
+struct GraphSnapshot {
+  Infos nodes;
+  Edges edges;
+  std::vector<Infos> outs, ins;
+  std::vector<std::set<KvCCallOperation*>> calls;
+  std::vector<std::set<KvCParamSymbol*>> called;
+  bool operator==(const GraphSnapshot&) const = default;
+};
+
+GraphSnapshot snapshot(const KvCGenericFunctionCallGraph& g,
+                       const std::vector<KvCParamSymbol*>& functions) {
+  GraphSnapshot s{nodesOf(g), edgesOf(g), {}, {}, {}, {}};
+  for (leda::node v : g.all_nodes()) {
+    s.outs.emplace_back();
+    s.ins.emplace_back();
+    for (leda::edge e : g.out_edges(v))
+      s.outs.back().push_back(g.inf(g.target(e)));
+    for (leda::edge e : g.in_edges(v))
+      s.ins.back().push_back(g.inf(g.source(e)));
+  }
+  for (KvCParamSymbol* f : functions) {
+    s.calls.push_back(callsOf(f));
+    s.called.push_back(calledOf(f));
+  }
+  return s;
+}
+
+void forgetSets(const std::vector<KvCParamSymbol*>& functions) {
+  for (KvCParamSymbol* f : functions) {
+    infoOf(f)->getCallOperationsSet().clear();
+    infoOf(f)->getCalledFunctionsSet().clear();
+  }
+}
+
+// called(passed): the access of `passed` is a direct operand of the call, so the call is
+// among the uses of both functions.
+KV_ExprLocation* callPassing(AppBuilder& app, KvCParamSymbol* called, KvCParamSymbol* passed) {
+  KvCCallOperation* op =
+      app.factories().getOperationFactory()->createCallOperation(called, {app.access(passed)});
+  return app.factories().getExprLocFactory()->createFromOperation(op);
+}
+
+TEST_F(GenericCallGraphTest, ConstructAgreesWithEnteringEachUseInTurn) {
+  for (unsigned seed = 1; seed <= 4; ++seed) {
+    SCOPED_TRACE("seed " + std::to_string(seed));
+    AppBuilder& local = app;
+    const std::string prefix = "s" + std::to_string(seed) + "_";
+    std::mt19937_64 rng(seed);
+    auto pick = [&](std::size_t bound) { return static_cast<std::size_t>(rng() % bound); };
+    auto callPassing = [&](KvCParamSymbol* called, KvCParamSymbol* passed) {
+      return ::callPassing(local, called, passed);
+    };
+    auto function = [&](const std::string& name) {
+      return local.function((prefix + name).c_str()).symbol();
+    };
+    std::vector<KvCParamSymbol*> all;
+    // Passed as arguments by the hubs, one listed before every other function, one after.
+    KvCParamSymbol* early = function("early");
+    all.push_back(early);
+    std::vector<KvCParamSymbol*> f, hubs, targets;
+    for (int i = 0; i < 60; ++i)
+      f.push_back(function("f" + std::to_string(i)));
+    for (int i = 0; i < 36; ++i) {
+      hubs.push_back(function("h" + std::to_string(i)));
+      targets.push_back(function("t" + std::to_string(i)));
+    }
+    KvCParamSymbol* late = function("late");
+    all.insert(all.end(), f.begin(), f.end());
+    all.insert(all.end(), hubs.begin(), hubs.end());
+    all.insert(all.end(), targets.begin(), targets.end());
+    all.push_back(late);
+    // Random calls, some repeated, some recursive, some task activations, some passing a
+    // function as an argument (so the call is reached through that function's uses too).
+    for (int k = 0; k < 600; ++k) {
+      KvCParamSymbol* from = f[pick(f.size())];
+      KvCParamSymbol* to = pick(8) == 0 ? from : f[pick(f.size())];
+      KV_ExprLocation* loc = nullptr;
+      if (pick(10) == 0) {
+        loc = local.taskActivation(to);
+      } else if (pick(3) == 0) {
+        loc = callPassing(to, f[pick(f.size())]);
+      } else {
+        loc = local.call(to, {local.constant(1)});
+      }
+      local.functionBuilder(from->getName().c_str()).body().stmt(loc);
+    }
+    // Every hub calls every target (in a shuffled order) passing early or late: those
+    // pairs are met again through early's and late's uses, between nodes of high degree.
+    for (KvCParamSymbol* hub : hubs) {
+      std::vector<KvCParamSymbol*> order = targets;
+      std::shuffle(order.begin(), order.end(), rng);
+      for (KvCParamSymbol* target : order)
+        local.functionBuilder(hub->getName().c_str())
+            .body()
+            .stmt(callPassing(target, pick(2) == 0 ? early : late));
+    }
+    buildDatabases();
+
+    OneByOneGraph reference;
+    reference.enterUsesOneByOne();
+    const GraphSnapshot expected = snapshot(reference, all);
+    ASSERT_GT(expected.edges.size(), 36u * 36u);
+
+    for (int round = 0; round < 2; ++round) {
+      forgetSets(all);
+      KvCGenericFunctionCallGraph plain;
+      ASSERT_TRUE(plain.construct(false));
+      EXPECT_EQ(snapshot(plain, all), expected) << "plain hooks, round " << round;
+      forgetSets(all);
+      OneByOneGraph hooked;
+      ASSERT_TRUE(hooked.construct(false));
+      ASSERT_TRUE(hooked.construct(false)) << "a reconstruction reuses the nodes";
+      EXPECT_EQ(snapshot(hooked, all), expected);
+      EXPECT_EQ(hooked.edgeHookCalls, 2 * static_cast<int>([&] {
+                                        int calls = 0;
+                                        for (const EdgeRow& e : expected.edges)
+                                          calls += std::get<2>(e);
+                                        return calls;
+                                      }()));
+      // Single calls still find the constructed edges through the index.
+      KvCCallOperation* someCall = *callsOf(targets[0]).begin();
+      leda::edge e = nullptr;
+      ASSERT_TRUE(plain.getEdge(infoOf(someCall->getCallingSymbol()), infoOf(targets[0]), e));
+      const int before = plain.inf(e)->getCardinality();
+      ASSERT_TRUE(plain.addCall(someCall));
+      EXPECT_EQ(plain.inf(e)->getCardinality(), before + 1);
+      EXPECT_EQ(plain.number_of_edges(), static_cast<int>(expected.edges.size()));
+    }
+  }
+  EXPECT_TRUE(messageNumbers().empty());
 }
 
 } // namespace
