@@ -84,3 +84,27 @@ TEST(FcgSortedSetTest, RefillsInAnyOrderAfterClearAndKeepsStoredElements) {
 }
 
 } // namespace
+
+namespace {
+
+TEST(FcgSortedSetTest, AscendingAppendsPassTheArrayLimitAndKeepOrder) {
+  IntSet s;
+  std::set<int> reference;
+  std::vector<int> run;
+  // Runs of 50 ascending values above everything stored: the array, then the tree form.
+  for (int k = 0; k < 8; ++k) {
+    run.clear();
+    for (int i = 0; i < 50; ++i)
+      run.push_back(k * 100 + i * 2);
+    s.appendAscending(run.data(), run.size());
+    reference.insert(run.begin(), run.end());
+    expectSame(s, reference);
+    ASSERT_EQ(s.back(), *reference.rbegin());
+    // Later insertions and deletions still find their places.
+    ASSERT_EQ(s.insert(k * 100 + 1), reference.insert(k * 100 + 1).second);
+    ASSERT_EQ(s.del(k * 100), reference.erase(k * 100) == 1);
+    expectSame(s, reference);
+  }
+}
+
+} // namespace
