@@ -11,6 +11,7 @@
 #include <algorithm>
 #include <cstdint>
 #include <typeinfo>
+#include <utility>
 
 // The graph type every call graph of the library derives from, instantiated and exported
 // here once.
@@ -279,18 +280,24 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
   std::vector<std::size_t> starts;
   starts.reserve(functions.size() + 1);
   const std::size_t count = functions.size();
+  listedIndices.clear();
   for (std::size_t f = 0; f < count; ++f) {
-    // The symbols lie scattered; their databases are fetched a few symbols ahead.
+    // The symbols lie scattered; their databases and node map entries are fetched a few
+    // symbols ahead.
     if (f + 16 < count)
       functions[f + 16]->getExprLocDB()->prefetchUseRecords();
-    if (f + 8 < count)
+    if (f + 8 < count) {
       functions[f + 8]->getExprLocDB()->prefetchUses();
+      nodes.prefetch_slot(functions[f + 8]->getFunctionInfo());
+    }
+    if (f + 4 < count)
+      nodes.prefetch_entry(functions[f + 4]->getFunctionInfo());
     starts.push_back(useBuffer.size());
     functions[f]->getExprLocDB()->listUses(listedUses);
     useBuffer.insert(useBuffer.end(), listedUses.begin(), listedUses.end());
+    listedIndices.push_back(enterFunctionSlot(functions[f]));
   }
   starts.push_back(useBuffer.size());
-  fillFunctionSlots(functions);
   resolveUses();
 
   // The records are carried out in batches small enough to stay in the cache.
@@ -300,7 +307,7 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
     if (f + 8 < count)
       KvCPrefetch::read(functions[f + 8]);
     KvCParamSymbol* function = functions[f];
-    const int index = function->getDebugIndex();
+    const int index = listedIndices[f];
     const FunctionSlot* slot = slotOf(function, index);
     KvCFcgFunctionInfo* info = slot ? slot->info : provideFcgNodeInfo(function);
     if (!info)
@@ -391,7 +398,6 @@ void KvCGenericFunctionCallGraph::resolveUses() {
   sortUsesByAddress();
   constexpr std::size_t kFar = 16;
   constexpr std::size_t kNear = 8;
-  constexpr std::size_t kClose = 4;
   KvCParamSymbol* lastCalling = nullptr;
   KvCFcgFunctionInfo* callingInfo = nullptr;
   int callingIndex = -1;
@@ -408,8 +414,6 @@ void KvCGenericFunctionCallGraph::resolveUses() {
       KvCPrefetch::read(parent + 64);
       KvCPrefetch::read(parent + 128);
     }
-    if (k + kClose < n)
-      prefetchCallingSymbol(useOrder[k + kClose].use);
     UseRecord& record = useRecords[useOrder[k].index];
     KV_Operation* op = useOrder[k].use->getOperation();
     if (!op) {
@@ -451,33 +455,14 @@ void KvCGenericFunctionCallGraph::resolveUses() {
   }
 }
 
-void KvCGenericFunctionCallGraph::prefetchCallingSymbol(const KV_ExprLocation* use) {
-  KV_ICodeElem* parent = use->getParent();
-  KV_Operation* op = parent ? parent->asOperation() : nullptr;
-  const KvCCallOperation* call = op ? op->asCallOperation() : nullptr;
-  if (call && call->isCallingSymbolKnown())
-    KvCPrefetch::read(call->getCallingSymbol());
-}
-
-void KvCGenericFunctionCallGraph::fillFunctionSlots(const std::vector<KvCParamSymbol*>& functions) {
-  // Each symbol is fetched kFar places ahead, its map entry kNear places ahead.
-  constexpr std::size_t kFar = 16;
-  constexpr std::size_t kNear = 8;
-  const std::size_t n = functions.size();
-  for (std::size_t f = 0; f < n; ++f) {
-    if (f + kFar < n)
-      KvCPrefetch::read(functions[f + kFar]);
-    if (f + kNear < n)
-      nodes.prefetch_slot(functions[f + kNear]->getFunctionInfo());
-    KvCParamSymbol* function = functions[f];
-    const int index = function->getDebugIndex();
-    const auto slot = static_cast<std::size_t>(index);
-    if (index < 0 || slot >= functionSlots.size())
-      continue;
-    KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
-    functionSlots[slot] =
-        FunctionSlot{function, info, info ? existingNodeOf(info, index) : nullptr};
-  }
+int KvCGenericFunctionCallGraph::enterFunctionSlot(KvCParamSymbol* function) {
+  const int index = function->getDebugIndex();
+  const auto slot = static_cast<std::size_t>(index);
+  if (index < 0 || slot >= functionSlots.size())
+    return index;
+  KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
+  functionSlots[slot] = FunctionSlot{function, info, info ? existingNodeOf(info, index) : nullptr};
+  return index;
 }
 
 const KvCGenericFunctionCallGraph::FunctionSlot*
@@ -493,9 +478,10 @@ leda::node KvCGenericFunctionCallGraph::existingNodeOf(KvCFcgFunctionInfo* funct
   const bool cacheable = index >= 0 && slot < functionSlots.size();
   if (cacheable && functionSlots[slot].node && functionSlots[slot].info == function)
     return functionSlots[slot].node;
-  if (!nodes.defined(function))
+  // One probe: an undefined key reads as a null node.
+  const leda::node v = std::as_const(nodes)[function];
+  if (!v)
     return nullptr;
-  const leda::node v = nodes[function];
   if (cacheable && functionSlots[slot].info == function)
     functionSlots[slot].node = v;
   return v;
@@ -575,14 +561,12 @@ void KvCGenericFunctionCallGraph::prefetchNodes(const Step& step, bool near) con
   }
   if (step.kind != Step::kNode)
     return;
-  // A function's first record: its map entry, and for the node hook its info, its symbol
-  // and the symbol's body.
+  // A function's first record: for the node hook its info, its symbol and the symbol's
+  // body (the node is in the function's slot).
   if (!near) {
-    nodes.prefetch_slot(step.calling);
     KvCPrefetch::read(step.calling);
     KvCPrefetch::read(step.function);
   } else {
-    nodes.prefetch_entry(step.calling);
     KvCPrefetch::read(step.function->getBodySTT());
   }
 }
@@ -620,7 +604,10 @@ void KvCGenericFunctionCallGraph::enterEdge(const Step& step) {
     step.called->addCallOperation(step.call);
   }
   if (!step.selfCall) {
-    const KvCFcgCalledFunction called = step.called->asCalledFunction();
+    const bool own = step.ownCall && step.called == groupInfo;
+    const KvCFcgCalledFunction called =
+        own ? KvCFcgCalledFunction{groupCalledIndex, groupCalledSymbol}
+            : step.called->asCalledFunction();
     deferredCalled.push_back(
         DeferredCalled{index(step.v), called.debugIndex, step.calling, called.symbol});
   }
@@ -641,6 +628,9 @@ void KvCGenericFunctionCallGraph::beginGroup(leda::node w, KvCFcgFunctionInfo* i
   // another symbol's uses) are entered now, those made during the group as they are made.
   flushGroupCalls();
   groupInfo = info;
+  const KvCFcgCalledFunction called = info ? info->asCalledFunction() : KvCFcgCalledFunction{};
+  groupCalledIndex = called.debugIndex;
+  groupCalledSymbol = called.symbol;
   groupNode = w;
   const std::size_t expected = uses + static_cast<std::size_t>(indeg(w));
   std::size_t size = 8;

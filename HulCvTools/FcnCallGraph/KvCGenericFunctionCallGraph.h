@@ -181,13 +181,12 @@ private:
                 int index);
   // The function's node if it has one (through the function slots), else null.
   leda::node existingNodeOf(KvCFcgFunctionInfo* function, int index);
-  // Enters the listed functions (their infos and existing nodes) in the function slots.
-  void fillFunctionSlots(const std::vector<KvCParamSymbol*>& functions);
+  // Enters a listed function (its info and existing node) in its function slot and
+  // returns its debug index.
+  int enterFunctionSlot(KvCParamSymbol* function);
   struct FunctionSlot;
   // The slot of `function` (debug index `index`), or null when it has none.
   const FunctionSlot* slotOf(const KvCParamSymbol* function, int index) const;
-  // Cache hint: the calling function of the call above `use`, when known without walking.
-  static void prefetchCallingSymbol(const KV_ExprLocation* use);
   // Carries out the recorded steps in order and forgets them.
   void replaySteps();
   void prefetchNodes(const Step& step, bool near) const;
@@ -233,6 +232,7 @@ private:
   // Reused by construction for the uses of one symbol at a time.
   std::vector<KV_ExprLocation*> useBuffer;
   std::vector<KV_ExprLocation*> listedUses;
+  std::vector<int> listedIndices; // the debug indices of the functions being treated
   std::vector<Step> steps;
   std::vector<UseRecord> useRecords;
   // The uses sorted by address range, each with its place in useBuffer.
@@ -254,6 +254,9 @@ private:
   bool plainEdgeHook = false;
   leda::node groupNode = nullptr;
   KvCFcgFunctionInfo* groupInfo = nullptr;
+  // groupInfo as an element of a called-function set (see DeferredCalled).
+  int groupCalledIndex = 0;
+  KvCParamSymbol* groupCalledSymbol = nullptr;
   // The group's calls to its function, with their serial numbers, not yet in its set.
   std::vector<KvCCallOperation*> groupCalls;
   std::vector<int> groupSerials;

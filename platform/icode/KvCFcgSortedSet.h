@@ -170,6 +170,11 @@ public:
 private:
   bool insertIntoTree(const T& x) {
     const Less less;
+    // Past the greatest element: O(1) amortized at the end.
+    if (tree->empty() || less(*tree->rbegin(), x)) {
+      finger = tree->insert(tree->end(), x);
+      return true;
+    }
     // Like the array form: an ascending pass meets each element right after the one the
     // last insertion met (O(1) amortized instead of a descent through the tree).
     if (finger != tree->end()) {
