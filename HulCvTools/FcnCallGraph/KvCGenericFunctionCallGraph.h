@@ -20,11 +20,17 @@
 // nodes and edges carry.
 //
 // construct gives the graph and the function infos that entering every use's call with
-// addCall in symbol order would give, and calls each hook kind in that order. It works in
-// batches (read the model, register the nodes, enter edges and calls), so node hooks of a
-// batch run before its edge hooks, and it adds the called functions to the calling
-// functions' sets at the end, calling function by calling function: hooks must not rely
-// on those sets during construction. Cost: O(uses + functions) expected.
+// addCall in symbol order would give (same nodes, edges, edge and adjacency orders, sets).
+// It reads the uses' calls from the model in memory order first (asking
+// provideFcgNodeInfo in that order; it must answer the same for a symbol throughout a run),
+// then enters them in symbol order in batches: node hooks of a batch run before its edge
+// hooks, each hook kind in the order addCall would call it. A function's call operations
+// go to its set once its uses are entered, and the called functions to the calling
+// functions' sets at the end of the run: hooks must not rely on those sets during
+// construction. For the library's own graph types, whose edge hook is the base's,
+// construction sets the task mark itself. Edges are found through a table of the current
+// function's callers while the run lasts; the edge index is filled once at its end.
+// Cost: O(uses + functions) expected.
 #ifndef HULCVTOOLS_FCNCALLGRAPH_KVCGENERICFUNCTIONCALLGRAPH_H
 #define HULCVTOOLS_FCNCALLGRAPH_KVCGENERICFUNCTIONCALLGRAPH_H
 
@@ -131,9 +137,9 @@ private:
   // Enters the call of which `use` is an operand, if any.
   void enterUse(KV_ExprLocation* use);
 
-  // Construction runs in two passes over the uses: the first reads the model and records
-  // what each use asks for, the second carries the records out in order, fetching the
-  // graph memory of the records a few places ahead into the cache meanwhile.
+  // Construction reads what each use asks for (UseRecord, in memory order), turns the
+  // records into steps in symbol order and carries them out batch by batch, fetching the
+  // graph memory of the steps a few places ahead into the cache meanwhile.
   struct Step {
     enum Kind : unsigned char {
       kNode,       // register `calling` (the info of `function`) and synchronize it
