@@ -146,12 +146,6 @@ public:
     sorted.clear();
   }
 
-  // Cache hint for a lookup or insertion of the pair to come.
-  void prefetch(leda::node v, leda::node w) const {
-    if (!slots.empty())
-      KvCPrefetch::read(&slots[home(v, w)]);
-  }
-
 private:
   struct Slot {
     leda::node v = nullptr;
