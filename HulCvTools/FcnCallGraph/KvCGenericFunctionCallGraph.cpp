@@ -276,8 +276,14 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
   const std::size_t count = functions.size();
   listedIndices.clear();
   for (std::size_t f = 0; f < count; ++f) {
-    // The symbols lie scattered; their databases and node map entries are fetched a few
-    // symbols ahead.
+    // The symbols lie scattered: each is fetched whole kSymbolAhead places ahead, then its
+    // database, its uses and its node map entry at shorter distances.
+    constexpr std::size_t kSymbolAhead = 24;
+    if (f + kSymbolAhead < count) {
+      const char* symbol = reinterpret_cast<const char*>(functions[f + kSymbolAhead]);
+      for (std::size_t at = 0; at < sizeof(KvCParamSymbol); at += 64)
+        KvCPrefetch::read(symbol + at);
+    }
     if (f + 16 < count)
       functions[f + 16]->getExprLocDB()->prefetchUseRecords();
     if (f + 8 < count) {
@@ -298,8 +304,6 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
   constexpr std::size_t kBatch = 2048;
   steps.clear();
   for (std::size_t f = 0; f < count; ++f) {
-    if (f + 8 < count)
-      KvCPrefetch::read(functions[f + 8]);
     KvCParamSymbol* function = functions[f];
     const int index = listedIndices[f];
     const FunctionSlot* slot = slotOf(function, index);

@@ -5,9 +5,12 @@
 // and are filled in ascending order, cleared and filled again each time a call graph is
 // constructed. So the set keeps its elements in one sorted array while it is small: an
 // insertion at the end is O(1), a lookup is one binary search in contiguous memory, and
-// clear() keeps the array's capacity, so refilling allocates nothing. Once a set grows past
-// kFlatLimit elements it moves into a balanced tree (O(log n) for every update, whatever
-// the order) and stays there until it is cleared; large sets never pay O(n) per update.
+// clear() keeps the array's capacity, so refilling allocates nothing. Appends keep the array
+// however large it grows (a scheduler's called functions are appended in order, and
+// refilled in order they are met one after another in contiguous memory); the first
+// insertion or deletion inside an array of more than kFlatLimit elements moves the set into
+// a balanced tree (O(log n) for every update, whatever the order), where it stays until it
+// is cleared. So large sets never pay O(n) per update.
 //
 // Elements are ordered by `Less` (a stateless strict weak order); two elements are the same
 // member iff neither is less than the other, and inserting such an element keeps the stored
@@ -90,10 +93,12 @@ public:
       last = at;
       if (!less(x, items[at]))
         return false;
+      if (items.size() >= kFlatLimit) {
+        moveToTree();
+        return insertIntoTree(x);
+      }
       items.insert(items.begin() + static_cast<std::ptrdiff_t>(at), x);
     }
-    if (items.size() > kFlatLimit)
-      moveToTree();
     return true;
   }
 
@@ -105,8 +110,6 @@ public:
       items.insert(items.end(), first, first + n);
       if (!items.empty())
         last = items.size() - 1;
-      if (items.size() > kFlatLimit)
-        moveToTree();
       return;
     }
     for (std::size_t i = 0; i < n; ++i)
@@ -131,6 +134,10 @@ public:
     auto at = std::lower_bound(items.begin(), items.end(), x, less);
     if (at == items.end() || less(x, *at))
       return false;
+    if (items.size() > kFlatLimit) {
+      moveToTree();
+      return del(x);
+    }
     items.erase(at);
     last = 0;
     return true;
