@@ -516,7 +516,7 @@ void KvCGenericFunctionCallGraph::replaySteps() {
     const Step& step = steps[i];
     switch (step.kind) {
     case Step::kNode:
-      beginGroup(step.v, step.calling, step.groupUses);
+      beginGroup(step);
       break;
     case Step::kIncomplete:
       incomplete = true;
@@ -570,6 +570,14 @@ void KvCGenericFunctionCallGraph::prefetchNodes(const Step& step, bool near) con
 }
 
 void KvCGenericFunctionCallGraph::prefetchEdge(const Step& step, bool near) const {
+  if (step.kind == Step::kNode) {
+    // The group's node (its in-edges) and its info's set of call operations.
+    if (!near)
+      prefetch_node(step.v);
+    else
+      step.calling->getCallOperationsSet().prefetch();
+    return;
+  }
   if (step.kind != Step::kEdge)
     return;
   if (!near) {
@@ -620,15 +628,19 @@ void KvCGenericFunctionCallGraph::flushGroupCalls() {
   groupSerials.clear();
 }
 
-void KvCGenericFunctionCallGraph::beginGroup(leda::node w, KvCFcgFunctionInfo* info,
-                                             std::size_t uses) {
+void KvCGenericFunctionCallGraph::beginGroup(const Step& step) {
+  const leda::node w = step.v;
+  KvCFcgFunctionInfo* info = step.calling;
+  const std::size_t uses = step.groupUses;
   // The table holds every edge into w: those made before (by calls that reached w through
   // another symbol's uses) are entered now, those made during the group as they are made.
   flushGroupCalls();
   groupInfo = info;
-  const KvCFcgCalledFunction called = info ? info->asCalledFunction() : KvCFcgCalledFunction{};
-  groupCalledIndex = called.debugIndex;
-  groupCalledSymbol = called.symbol;
+  // The info's own symbol is almost always the step's function, whose index is known.
+  groupCalledSymbol = info ? info->getSymbol() : nullptr;
+  groupCalledIndex = groupCalledSymbol == step.function ? step.callingIndex
+                     : groupCalledSymbol                ? groupCalledSymbol->getDebugIndex()
+                                                        : 0;
   groupNode = w;
   const std::size_t expected = uses + static_cast<std::size_t>(indeg(w));
   std::size_t size = 8;

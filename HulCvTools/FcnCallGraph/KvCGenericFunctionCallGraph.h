@@ -208,8 +208,8 @@ private:
   leda::edge linkNewEdge(leda::node v, leda::node w);
   // While constructing: the edge v -> w, or null.
   leda::edge findConstructedEdge(leda::node v, leda::node w);
-  // Starts the uses of the function whose node is w (`uses` of them).
-  void beginGroup(leda::node w, KvCFcgFunctionInfo* info, std::size_t uses);
+  // Starts the uses of the function of a kNode step (its node is step.v).
+  void beginGroup(const Step& step);
   // Adds the group's calls to its function's set of call operations.
   void flushGroupCalls();
   std::size_t groupHome(leda::node v) const;
