@@ -247,6 +247,9 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
   // construction then does itself from what it read with the rest of the call.
   plainEdgeHook = typeid(*this) == typeid(KvCGenericFunctionCallGraph) ||
                   typeid(*this) == typeid(KvCFunctionCallGraph);
+  // Their hooks do not look at the graph either, so new edges join their calling
+  // functions' out-edges at the end of the run, calling function by calling function.
+  deferOutLinks = plainEdgeHook;
   std::size_t listed = 0;
   for (;;) {
     std::vector<KvCParamSymbol*> functions;
@@ -258,6 +261,8 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
     treatFcnSymbols(functions);
   }
   flushGroupCalls();
+  linkPendingOutEdges();
+  deferOutLinks = false;
   constructing = false;
   groupNode = nullptr;
   groupInfo = nullptr;
@@ -581,12 +586,14 @@ void KvCGenericFunctionCallGraph::prefetchEdge(const Step& step, bool near) cons
   if (step.kind != Step::kEdge)
     return;
   if (!near) {
-    prefetch_node(step.v);
+    if (!deferOutLinks)
+      prefetch_node(step.v);
     if (!plainEdgeHook || !step.ownCall)
       KvCPrefetch::read(step.call);
     return;
   }
-  prefetch_out_end(step.v);
+  if (!deferOutLinks)
+    prefetch_out_end(step.v);
 }
 
 void KvCGenericFunctionCallGraph::enterEdge(const Step& step) {
@@ -614,8 +621,8 @@ void KvCGenericFunctionCallGraph::enterEdge(const Step& step) {
     const KvCFcgCalledFunction called =
         own ? KvCFcgCalledFunction{groupCalledIndex, groupCalledSymbol}
             : step.called->asCalledFunction();
-    deferredCalled.push_back(
-        DeferredCalled{index(step.v), called.debugIndex, step.calling, called.symbol});
+    deferredCalled.push_back(DeferredCalled{callerKey(step.callingIndex), called.debugIndex,
+                                            step.calling, called.symbol});
   }
 }
 
@@ -691,6 +698,16 @@ leda::edge KvCGenericFunctionCallGraph::findConstructedEdge(leda::node v, leda::
   // A call reached through another symbol's uses (a function passed as an argument): the
   // shorter of the two edge lists is scanned; beyond a few edges the index is filled.
   constexpr int kScanLimit = 32;
+  if (deferOutLinks) { // the out-edge lists are not complete yet
+    if (indeg(w) > kScanLimit) {
+      ensureEdgeIndex();
+      return edgeIndex->find(v, w);
+    }
+    for (leda::edge e : in_edges(w))
+      if (source(e) == v)
+        return e;
+    return nullptr;
+  }
   if (std::min(outdeg(v), indeg(w)) > kScanLimit) {
     ensureEdgeIndex();
     return edgeIndex->find(v, w);
@@ -709,7 +726,9 @@ leda::edge KvCGenericFunctionCallGraph::findConstructedEdge(leda::node v, leda::
 
 leda::edge KvCGenericFunctionCallGraph::linkNewEdge(leda::node v, leda::node w) {
   KvCFcgEdgeInfo* info = createFcgEdgeInfo();
-  const leda::edge e = new_edge(v, w, info);
+  const leda::edge e = deferOutLinks ? new_edge_out_later(v, w, info) : new_edge(v, w, info);
+  if (deferOutLinks)
+    pendingOut.push_back(PendingOut{v, e});
   if (edgeIndexCurrent)
     edgeIndex->insert(v, w, e);
   if (constructing && w == groupNode)
@@ -717,6 +736,49 @@ leda::edge KvCGenericFunctionCallGraph::linkNewEdge(leda::node v, leda::node w) 
   if (info)
     info->incCardinality();
   return e;
+}
+
+int KvCGenericFunctionCallGraph::callerKey(int callingIndex) const {
+  const auto slot = static_cast<std::size_t>(callingIndex);
+  return callingIndex >= 0 && slot < functionSlots.size() ? callingIndex
+                                                          : static_cast<int>(functionSlots.size());
+}
+
+void KvCGenericFunctionCallGraph::linkPendingOutEdges() {
+  // A stable radix sort by calling node address keeps each node's new edges in creation
+  // order; the nodes are then visited in address order, each once.
+  const std::size_t n = pendingOut.size();
+  if (n == 0)
+    return;
+  std::uintptr_t low = UINTPTR_MAX;
+  std::uintptr_t high = 0;
+  for (const PendingOut& p : pendingOut) {
+    low = std::min(low, reinterpret_cast<std::uintptr_t>(p.v));
+    high = std::max(high, reinterpret_cast<std::uintptr_t>(p.v));
+  }
+  constexpr unsigned kDigitBits = 11;
+  constexpr std::size_t kDigits = std::size_t{1} << kDigitBits;
+  std::vector<PendingOut> other(n);
+  std::vector<std::size_t> start(kDigits + 1);
+  for (unsigned shift = 0; shift < 64 && ((high - low) >> shift) != 0; shift += kDigitBits) {
+    std::fill(start.begin(), start.end(), 0);
+    auto digit = [&](const PendingOut& p) {
+      return static_cast<std::size_t>(((reinterpret_cast<std::uintptr_t>(p.v) - low) >> shift) &
+                                      (kDigits - 1));
+    };
+    for (const PendingOut& p : pendingOut)
+      ++start[digit(p) + 1];
+    for (std::size_t d = 1; d <= kDigits; ++d)
+      start[d] += start[d - 1];
+    for (const PendingOut& p : pendingOut)
+      other[start[digit(p)]++] = p;
+    pendingOut.swap(other);
+  }
+  std::vector<leda::edge> edges(n);
+  for (std::size_t i = 0; i < n; ++i)
+    edges[i] = pendingOut[i].e;
+  pendingOut.clear();
+  link_out_edges(edges.data(), n);
 }
 
 void KvCGenericFunctionCallGraph::ensureEdgeIndex() const {
@@ -727,9 +789,9 @@ void KvCGenericFunctionCallGraph::ensureEdgeIndex() const {
 }
 
 void KvCGenericFunctionCallGraph::addDeferredCalledFcns() {
-  // A counting sort by calling node keeps each calling function's entries in the order
-  // they were met; every set is then loaded once.
-  const std::size_t buckets = static_cast<std::size_t>(max_node_index()) + 2;
+  // A counting sort by calling function keeps each one's entries in the order they were
+  // met; every set is then loaded once.
+  const std::size_t buckets = functionSlots.size() + 1;
   std::vector<std::size_t> start(buckets + 1, 0);
   for (const DeferredCalled& d : deferredCalled)
     ++start[static_cast<std::size_t>(d.callingNode) + 1];
@@ -908,6 +970,7 @@ int KvCGenericFunctionCallGraph::getNrOfCalled(KvCFcgFunctionInfo* function) con
 // --- removal
 
 void KvCGenericFunctionCallGraph::deleteEdge(leda::edge e) {
+  linkPendingOutEdges();
   ensureEdgeIndex();
   edgeIndex->erase(source(e), target(e), e);
   // A hook deleting edges while construct runs: the group table may hold this edge, so

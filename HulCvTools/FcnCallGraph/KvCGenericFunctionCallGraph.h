@@ -217,6 +217,11 @@ private:
   void groupInsert(leda::node v, leda::edge e);
   // Fills the edge index from the graph when construction left it behind.
   void ensureEdgeIndex() const;
+  // A calling function's bucket when construction groups by calling function: its debug
+  // index when it has a function slot, else one shared last bucket.
+  int callerKey(int callingIndex) const;
+  // Appends the edges made with their out-edge links deferred to their sources' lists.
+  void linkPendingOutEdges();
   // Adds the called functions that construction deferred, grouped by calling function.
   void addDeferredCalledFcns();
 
@@ -258,6 +263,13 @@ private:
   bool constructing = false;
   // The graph's edge hook is the base's (see construct).
   bool plainEdgeHook = false;
+  // New edges wait in pendingOut for their place in the calling node's out-edges.
+  bool deferOutLinks = false;
+  struct PendingOut {
+    leda::node v;
+    leda::edge e;
+  };
+  std::vector<PendingOut> pendingOut;
   leda::node groupNode = nullptr;
   KvCFcgFunctionInfo* groupInfo = nullptr;
   // groupInfo as an element of a called-function set (see DeferredCalled).
@@ -282,7 +294,7 @@ private:
   // them calling function by calling function, which loads each set once instead of once
   // per call.
   struct DeferredCalled {
-    int callingNode;      // index of the calling node
+    int callingNode;      // the calling function's key (callerKey)
     int calledDebugIndex; // with calledSymbol, the called function as its set keeps it
     KvCFcgFunctionInfo* calling;
     KvCParamSymbol* calledSymbol;

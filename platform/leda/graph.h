@@ -247,6 +247,18 @@ public:
   node new_node() { return linkNode(makeNode()); }
   edge new_edge(node v, node w) { return linkEdge(makeEdge(), v, w); }
 
+  // Bulk building, where appending to the source's out-edges one edge at a time would
+  // visit the sources in scattered order: new_edge_out_later (in GRAPH) makes an edge that
+  // is in the edge list and in w's in-edges but not yet in v's out-edges (nor counted in
+  // v's out-degree); link_out_edges then appends such edges to their sources' out-edges,
+  // in the order given (group them by source, each source's in creation order, so the
+  // sources are visited once each). Until then the edge must not be deleted or hidden,
+  // and v's out-edge list and out-degree leave it out.
+  void link_out_edges(const edge* edges, std::size_t n) {
+    for (std::size_t i = 0; i < n; ++i)
+      linkOut(edges[i]);
+  }
+
   // Deletes v and all its edges, hidden ones included. O(degree).
   void del_node(node v) {
     assert(v);
@@ -427,6 +439,14 @@ protected:
   }
 
   edge linkEdge(detail::EdgeRec* e, node v, node w) {
+    linkEdgeButOut(e, v, w);
+    linkOut(e);
+    return e;
+  }
+
+  // linkEdge without the append to v's out-edges and v's out-degree (see
+  // new_edge_out_later).
+  edge linkEdgeButOut(detail::EdgeRec* e, node v, node w) {
     assert(v && w);
     e->id = nextEdgeId_++;
     e->src = v;
@@ -434,15 +454,20 @@ protected:
     e->prev = lastEdge_;
     (lastEdge_ ? lastEdge_->next : firstEdge_) = e;
     lastEdge_ = e;
-    e->outPrev = v->outLast;
-    (v->outLast ? v->outLast->outNext : v->outFirst) = e;
-    v->outLast = e;
     e->inPrev = w->inLast;
     (w->inLast ? w->inLast->inNext : w->inFirst) = e;
     w->inLast = e;
-    adjustDegrees(e, +1);
+    ++w->indeg;
     ++edgeCount_;
     return e;
+  }
+
+  static void linkOut(edge e) {
+    node v = e->src;
+    e->outPrev = v->outLast;
+    (v->outLast ? v->outLast->outNext : v->outFirst) = e;
+    v->outLast = e;
+    ++v->outdeg;
   }
 
 private:
@@ -497,6 +522,11 @@ public:
   }
   edge new_edge(node v, node w, const E& x) {
     return linkEdge(new (edgeMemory(sizeof(detail::EdgeRecOf<E>))) detail::EdgeRecOf<E>(x), v, w);
+  }
+  // See graph::link_out_edges.
+  edge new_edge_out_later(node v, node w, const E& x) {
+    return linkEdgeButOut(new (edgeMemory(sizeof(detail::EdgeRecOf<E>))) detail::EdgeRecOf<E>(x), v,
+                          w);
   }
 
   const V& inf(node v) const { return payload(v); }
