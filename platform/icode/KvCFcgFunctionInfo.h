@@ -46,9 +46,8 @@ public:
   // Each answers whether the set changed.
   bool addCallOperation(KvCCallOperation* call);
   // Adds n call operations given with their serial numbers, as n addCallOperation calls
-  // would. When the serials ascend strictly and follow the set's greatest element the
-  // calls are appended without reading them (one read of that element); otherwise they
-  // are inserted one by one.
+  // would. Into an empty set, with strictly ascending serials, the calls are appended
+  // without reading them; otherwise they are inserted one by one.
   void addCallOperations(KvCCallOperation* const* calls, const int* serials, std::size_t n);
   bool delCallOperation(KvCCallOperation* call);
   bool addCalledFcn(KvCFcgFunctionInfo* called);

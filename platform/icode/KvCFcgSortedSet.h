@@ -24,6 +24,7 @@
 #include <iterator>
 #include <memory>
 #include <set>
+#include <type_traits>
 #include <vector>
 
 template <class T, class Less> class KvCFcgSortedSet {
@@ -31,6 +32,7 @@ template <class T, class Less> class KvCFcgSortedSet {
 
 public:
   static constexpr std::size_t kFlatLimit = 128;
+  static constexpr std::size_t kNone = static_cast<std::size_t>(-1);
 
   class const_iterator {
   public:
@@ -76,6 +78,12 @@ public:
   bool insert(const T& x) {
     if (tree)
       return insertIntoTree(x);
+    // The element after the one the last insertion met may be x itself: a refill of a set
+    // that kept its elements then compares no keys.
+    if (last + 1 < items.size() && same(items[last + 1], x)) {
+      ++last;
+      return false;
+    }
     const Less less;
     if (items.empty() || less(items.back(), x)) {
       items.push_back(x);
@@ -116,6 +124,14 @@ public:
       finger = tree->insert(tree->end(), first[i]);
   }
 
+  // Starts the next insertions' search for their elements at the front: a refill in
+  // ascending order of a set that kept its elements then meets each at once.
+  void rewind() {
+    last = kNone;
+    if (tree)
+      finger = tree->end();
+  }
+
   // The greatest element; the set must not be empty.
   const T& back() const { return tree ? *tree->rbegin() : items.back(); }
 
@@ -139,7 +155,7 @@ public:
       return del(x);
     }
     items.erase(at);
-    last = 0;
+    last = kNone;
     return true;
   }
 
@@ -158,7 +174,7 @@ public:
   void clear() {
     items.clear();
     tree.reset();
-    last = 0;
+    last = kNone;
   }
 
   const_iterator begin() const {
@@ -186,7 +202,7 @@ private:
     // last insertion met (O(1) amortized instead of a descent through the tree).
     if (finger != tree->end()) {
       const auto next = std::next(finger);
-      if (next != tree->end() && !less(*next, x) && !less(x, *next)) {
+      if (next != tree->end() && (same(*next, x) || (!less(*next, x) && !less(x, *next)))) {
         finger = next;
         return false;
       }
@@ -200,6 +216,14 @@ private:
     return inserted;
   }
 
+  // Identity of pointer elements: equal without comparing their keys.
+  static bool same(const T& a, const T& b) {
+    if constexpr (std::is_pointer_v<T>)
+      return a == b;
+    else
+      return false;
+  }
+
   void moveToTree() {
     tree = std::make_unique<Tree>(items.begin(), items.end());
     finger = tree->end();
@@ -209,7 +233,8 @@ private:
   std::vector<T> items;           // sorted; holds the elements while the set is small
   std::unique_ptr<Tree> tree;     // holds them once large
   typename Tree::iterator finger; // in the tree: the element the last insertion met, or end
-  std::size_t last = 0;           // where the last flat insertion met its element
+  // Where the last flat insertion met its element; kNone before the first.
+  std::size_t last = kNone;
 };
 
 #endif

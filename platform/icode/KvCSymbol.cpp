@@ -36,17 +36,15 @@ bool KvCFcgFunctionInfo::addCallOperation(KvCCallOperation* call) {
 
 void KvCFcgFunctionInfo::addCallOperations(KvCCallOperation* const* calls, const int* serials,
                                            std::size_t n) {
-  bool ordered = true;
+  bool ordered = callOperations.empty();
   for (std::size_t i = 0; i < n && ordered; ++i)
     ordered = calls[i] && (i == 0 || serials[i - 1] < serials[i]);
-  if (ordered && n > 0 && !callOperations.empty()) {
-    const KvCCallOperation* greatest = callOperations.back();
-    ordered = (greatest ? greatest->getSerial() : -1) < serials[0];
-  }
   if (ordered) {
     callOperations.appendAscending(calls, n);
     return;
   }
+  // A set that kept its elements (most often these very calls): one by one from the front.
+  callOperations.rewind();
   for (std::size_t i = 0; i < n; ++i)
     addCallOperation(calls[i]);
 }
