@@ -794,12 +794,12 @@ void KvCGenericFunctionCallGraph::addDeferredCalledFcns() {
   const std::size_t buckets = functionSlots.size() + 1;
   std::vector<std::size_t> start(buckets + 1, 0);
   for (const DeferredCalled& d : deferredCalled)
-    ++start[static_cast<std::size_t>(d.callingNode) + 1];
+    ++start[static_cast<std::size_t>(d.callingKey) + 1];
   for (std::size_t b = 1; b <= buckets; ++b)
     start[b] += start[b - 1];
   deferredByCaller.resize(deferredCalled.size());
   for (const DeferredCalled& d : deferredCalled)
-    deferredByCaller[start[static_cast<std::size_t>(d.callingNode)]++] = d;
+    deferredByCaller[start[static_cast<std::size_t>(d.callingKey)]++] = d;
   deferredCalled.clear();
   constexpr std::size_t kAhead = 8;
   const std::size_t n = deferredByCaller.size();

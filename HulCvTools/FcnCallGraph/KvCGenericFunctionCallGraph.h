@@ -153,7 +153,7 @@ private:
     bool taskCall = false; // kEdge: the call activates a task
     bool ownCall = false;  // kEdge: `called` is the function whose uses these are
     // Debug indices of the calling and the called symbol (kNode: of `function`), or -1;
-    // they key the node cache of a construction run.
+    // they key the function slots of a construction run.
     int callingIndex = -1;
     int calledIndex = -1;
     int serial = 0;            // kEdge: the call's serial number
@@ -162,7 +162,8 @@ private:
     KvCFcgFunctionInfo* called = nullptr;
     KvCParamSymbol* function = nullptr;
     KvCCallOperation* call = nullptr;
-    leda::node v = nullptr; // the calling and called node of a kEdge record, once registered
+    // kEdge: the calling and called node, once registered; kNode: the function's node.
+    leda::node v = nullptr;
     leda::node w = nullptr;
   };
   // What one use asks for, read from the model before the steps are made (kEdge: `v` is
@@ -196,8 +197,8 @@ private:
   // Carries out the recorded steps in order and forgets them.
   void replaySteps();
   void prefetchNodes(const Step& step, bool near) const;
-  // The node of `function` through the run's node cache (slot `index`), registering it
-  // when missing.
+  // The node of `function` through its function slot (debug index `index`), registering
+  // it when missing.
   leda::node cachedNodeOf(KvCFcgFunctionInfo* function, int index);
   void prefetchEdge(const Step& step, bool near) const;
   // addEdge between registered nodes.
@@ -240,7 +241,7 @@ private:
   // Storage of the edge infos the base hook makes (the destructor deletes every info
   // before the pool goes).
   std::unique_ptr<KvCObjectPool> edgeInfoPool;
-  // Reused by construction for the uses of one symbol at a time.
+  // Scratch of construction, reused from run to run: the uses of the symbols being treated.
   std::vector<KV_ExprLocation*> useBuffer;
   std::vector<KV_ExprLocation*> listedUses;
   std::vector<int> listedIndices; // the debug indices of the functions being treated
@@ -294,7 +295,7 @@ private:
   // them calling function by calling function, which loads each set once instead of once
   // per call.
   struct DeferredCalled {
-    int callingNode;      // the calling function's key (callerKey)
+    int callingKey;       // the calling function's bucket (callerKey)
     int calledDebugIndex; // with calledSymbol, the called function as its set keeps it
     KvCFcgFunctionInfo* calling;
     KvCParamSymbol* calledSymbol;
