@@ -269,7 +269,10 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
   addDeferredCalledFcns();
   ensureEdgeIndex();
   functionSlots = std::vector<FunctionSlot>();
+  // The per-use scratch is as large as the uses; it is not kept between runs.
   useRecords = std::vector<UseRecord>();
+  useOrder = std::vector<SortedUse>();
+  pendingOut = std::vector<PendingOut>();
   return !incomplete;
 }
 
