@@ -479,17 +479,22 @@ KvCGenericFunctionCallGraph::slotOf(const KvCParamSymbol* function, int index) c
   return &functionSlots[slot];
 }
 
+KvCGenericFunctionCallGraph::FunctionSlot*
+KvCGenericFunctionCallGraph::slotOfInfo(KvCFcgFunctionInfo* function, int index) {
+  const auto at = static_cast<std::size_t>(index);
+  if (index < 0 || at >= functionSlots.size() || functionSlots[at].info != function)
+    return nullptr;
+  return &functionSlots[at];
+}
+
 leda::node KvCGenericFunctionCallGraph::existingNodeOf(KvCFcgFunctionInfo* function, int index) {
-  const auto slot = static_cast<std::size_t>(index);
-  const bool cacheable = index >= 0 && slot < functionSlots.size();
-  if (cacheable && functionSlots[slot].node && functionSlots[slot].info == function)
-    return functionSlots[slot].node;
+  FunctionSlot* slot = slotOfInfo(function, index);
+  if (slot && slot->node)
+    return slot->node;
   // One probe: an undefined key reads as a null node.
   const leda::node v = std::as_const(nodes)[function];
-  if (!v)
-    return nullptr;
-  if (cacheable && functionSlots[slot].info == function)
-    functionSlots[slot].node = v;
+  if (slot)
+    slot->node = v;
   return v;
 }
 
@@ -543,15 +548,12 @@ void KvCGenericFunctionCallGraph::replaySteps() {
 }
 
 leda::node KvCGenericFunctionCallGraph::cachedNodeOf(KvCFcgFunctionInfo* function, int index) {
-  const auto at = static_cast<std::size_t>(index);
-  if (index < 0 || at >= functionSlots.size())
-    return nodeOf(function);
-  FunctionSlot& slot = functionSlots[at];
-  if (slot.node && slot.info == function)
-    return slot.node;
+  FunctionSlot* slot = slotOfInfo(function, index);
+  if (slot && slot->node)
+    return slot->node;
   const leda::node v = nodeOf(function);
-  if (slot.info == function)
-    slot.node = v;
+  if (slot)
+    slot->node = v;
   return v;
 }
 
@@ -699,23 +701,15 @@ leda::edge KvCGenericFunctionCallGraph::findConstructedEdge(leda::node v, leda::
   if (edgeIndexCurrent)
     return edgeIndex->find(v, w);
   // A call reached through another symbol's uses (a function passed as an argument): the
-  // shorter of the two edge lists is scanned; beyond a few edges the index is filled.
+  // shorter of the two edge lists is scanned (only the in-edges while out-edge links wait
+  // for the end of the run); beyond a few edges the index is filled.
   constexpr int kScanLimit = 32;
-  if (deferOutLinks) { // the out-edge lists are not complete yet
-    if (indeg(w) > kScanLimit) {
-      ensureEdgeIndex();
-      return edgeIndex->find(v, w);
-    }
-    for (leda::edge e : in_edges(w))
-      if (source(e) == v)
-        return e;
-    return nullptr;
-  }
-  if (std::min(outdeg(v), indeg(w)) > kScanLimit) {
+  const bool scanOut = !deferOutLinks && outdeg(v) <= indeg(w);
+  if ((scanOut ? outdeg(v) : indeg(w)) > kScanLimit) {
     ensureEdgeIndex();
     return edgeIndex->find(v, w);
   }
-  if (outdeg(v) <= indeg(w)) {
+  if (scanOut) {
     for (leda::edge e : out_edges(v))
       if (target(e) == w)
         return e;

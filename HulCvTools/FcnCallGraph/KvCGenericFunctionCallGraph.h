@@ -192,6 +192,8 @@ private:
   // returns its debug index.
   int enterFunctionSlot(KvCParamSymbol* function);
   struct FunctionSlot;
+  // The slot at `index` when it names the info `function`, else null.
+  FunctionSlot* slotOfInfo(KvCFcgFunctionInfo* function, int index);
   // The slot of `function` (debug index `index`), or null when it has none.
   const FunctionSlot* slotOf(const KvCParamSymbol* function, int index) const;
   // Carries out the recorded steps in order and forgets them.
