@@ -236,9 +236,17 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
   // in one sequence, so that prefetching runs ahead across symbol boundaries (a scheduler's
   // callees have one use each). Symbols made while treating are listed by a further walk.
   // Debug indices beyond a few times the number of symbols are looked up in the map.
-  functionSlots.assign(static_cast<std::size_t>(data->getSymbolDB()->getNumberOfSymbols()) * 2 +
-                           1024,
-                       FunctionSlot{});
+  // The slots are kept from run to run for the nodes they name (a reconstruction finds
+  // each function's node there instead of in the node map); a slot names a symbol and
+  // its info only for the run that entered it.
+  const std::size_t slotCount =
+      static_cast<std::size_t>(data->getSymbolDB()->getNumberOfSymbols()) * 2 + 1024;
+  if (++constructRun == 0) {
+    functionSlots.clear();
+    constructRun = 1;
+  }
+  if (functionSlots.size() < slotCount)
+    functionSlots.resize(slotCount);
   // Edges are found through the group table while the run lasts; the edge index is filled
   // once at its end.
   edgeIndexCurrent = false;
@@ -268,7 +276,6 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
   groupInfo = nullptr;
   addDeferredCalledFcns();
   ensureEdgeIndex();
-  functionSlots = std::vector<FunctionSlot>();
   // The per-use scratch is as large as the uses; it is not kept between runs.
   useRecords = std::vector<UseRecord>();
   useOrder = std::vector<SortedUse>();
@@ -296,10 +303,13 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
       functions[f + 16]->getExprLocDB()->prefetchUseRecords();
     if (f + 8 < count) {
       functions[f + 8]->getExprLocDB()->prefetchUses();
-      nodes.prefetch_slot(functions[f + 8]->getFunctionInfo());
+      prefetchFunctionSlot(functions[f + 8]);
     }
-    if (f + 4 < count)
+    // The node map only for functions whose slot does not name their node yet.
+    if (f + 4 < count && !slotNamesNode(functions[f + 4])) {
+      nodes.prefetch_slot(functions[f + 4]->getFunctionInfo());
       nodes.prefetch_entry(functions[f + 4]->getFunctionInfo());
+    }
     starts.push_back(useBuffer.size());
     functions[f]->getExprLocDB()->listUses(listedUses);
     useBuffer.insert(useBuffer.end(), listedUses.begin(), listedUses.end());
@@ -467,14 +477,32 @@ int KvCGenericFunctionCallGraph::enterFunctionSlot(KvCParamSymbol* function) {
   if (index < 0 || slot >= functionSlots.size())
     return index;
   KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
-  functionSlots[slot] = FunctionSlot{function, info, info ? existingNodeOf(info, index) : nullptr};
+  FunctionSlot& entry = functionSlots[slot];
+  // The node an earlier run found for the same info is still its node.
+  const leda::node known = entry.info == info ? entry.node : nullptr;
+  entry = FunctionSlot{function, info, known, constructRun};
+  if (info && !known)
+    entry.node = std::as_const(nodes)[info];
   return index;
+}
+
+void KvCGenericFunctionCallGraph::prefetchFunctionSlot(const KvCParamSymbol* function) const {
+  const auto at = static_cast<std::size_t>(function->getDebugIndex());
+  if (at < functionSlots.size())
+    KvCPrefetch::read(&functionSlots[at]);
+}
+
+bool KvCGenericFunctionCallGraph::slotNamesNode(KvCParamSymbol* function) const {
+  const auto at = static_cast<std::size_t>(function->getDebugIndex());
+  return at < functionSlots.size() && functionSlots[at].node &&
+         functionSlots[at].info == function->getFunctionInfo();
 }
 
 const KvCGenericFunctionCallGraph::FunctionSlot*
 KvCGenericFunctionCallGraph::slotOf(const KvCParamSymbol* function, int index) const {
   const auto slot = static_cast<std::size_t>(index);
-  if (index < 0 || slot >= functionSlots.size() || functionSlots[slot].symbol != function)
+  if (index < 0 || slot >= functionSlots.size() || functionSlots[slot].symbol != function ||
+      functionSlots[slot].run != constructRun)
     return nullptr;
   return &functionSlots[slot];
 }
@@ -1025,7 +1053,11 @@ void KvCGenericFunctionCallGraph::deleteAllNodes() {
   }
 }
 
-void KvCGenericFunctionCallGraph::clearNodeMap() { nodes.clear(); }
+void KvCGenericFunctionCallGraph::clearNodeMap() {
+  nodes.clear();
+  // The slots name nodes too.
+  functionSlots = std::vector<FunctionSlot>();
+}
 
 // --- roots and leaves
 
