@@ -291,13 +291,14 @@ void KvCGenericFunctionCallGraph::treatFcnSymbols(const std::vector<KvCParamSymb
   const std::size_t count = functions.size();
   listedIndices.clear();
   for (std::size_t f = 0; f < count; ++f) {
-    // The symbols lie scattered: each is fetched whole kSymbolAhead places ahead, then its
-    // database, its uses and its node map entry at shorter distances.
+    // The symbols lie scattered: kSymbolAhead places ahead the first and last line of each
+    // (debug index, info), then its database's use lists, its uses and its function slot
+    // (or node map entry) at shorter distances.
     constexpr std::size_t kSymbolAhead = 24;
     if (f + kSymbolAhead < count) {
       const char* symbol = reinterpret_cast<const char*>(functions[f + kSymbolAhead]);
-      for (std::size_t at = 0; at < sizeof(KvCParamSymbol); at += 64)
-        KvCPrefetch::read(symbol + at);
+      KvCPrefetch::read(symbol);
+      KvCPrefetch::read(symbol + sizeof(KvCParamSymbol) - 1);
     }
     if (f + 16 < count)
       functions[f + 16]->getExprLocDB()->prefetchUseRecords();
@@ -600,7 +601,7 @@ void KvCGenericFunctionCallGraph::prefetchNodes(const Step& step, bool near) con
   // A function's first record: for the node hook its info, its symbol and the symbol's
   // body (the node is in the function's slot).
   if (!near) {
-    KvCPrefetch::read(step.calling);
+    KvCPrefetch::readAll(step.calling, sizeof(KvCFcgFunctionInfo));
     KvCPrefetch::read(step.function);
   } else {
     KvCPrefetch::read(step.function->getBodySTT());
@@ -830,7 +831,7 @@ void KvCGenericFunctionCallGraph::addDeferredCalledFcns() {
   const std::size_t n = deferredByCaller.size();
   for (std::size_t i = 0; i < n; ++i) {
     if (i + kAhead < n)
-      KvCPrefetch::read(deferredByCaller[i + kAhead].calling);
+      KvCPrefetch::readAll(deferredByCaller[i + kAhead].calling, sizeof(KvCFcgFunctionInfo));
     if (i + kAhead / 2 < n)
       deferredByCaller[i + kAhead / 2].calling->getCalledFunctionsSet().prefetch();
     const DeferredCalled& d = deferredByCaller[i];

@@ -521,6 +521,8 @@ public:
   using graph::new_node;
 
   GRAPH() : graph(sizeof(detail::NodeRecOf<V>), sizeof(detail::EdgeRecOf<E>)) {}
+  // Cache hint for the whole record of v (which may straddle lines).
+  static void prefetch_node(node v) { KvCPrefetch::writeAll(v, sizeof(detail::NodeRecOf<V>)); }
 
   node new_node(const V& x) {
     return linkNode(new (nodeMemory(sizeof(detail::NodeRecOf<V>))) detail::NodeRecOf<V>(x));

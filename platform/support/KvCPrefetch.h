@@ -8,6 +8,9 @@
 #ifndef HUL_PLATFORM_SUPPORT_KVCPREFETCH_H
 #define HUL_PLATFORM_SUPPORT_KVCPREFETCH_H
 
+#include <cstddef>
+#include <cstdint>
+
 struct KvCPrefetch {
   // Hints that the line holding `p` will be read (write: written) soon. Never faults.
   static void read(const void* p) {
@@ -17,6 +20,28 @@ struct KvCPrefetch {
   static void write(const void* p) {
     __builtin_prefetch(p, 1);
     asm volatile("" : : "r"(p));
+  }
+  // The same for every line of the `size` bytes at `p` (an object that may straddle
+  // lines); nothing for size 0.
+  static void readAll(const void* p, std::size_t size) {
+    if (size == 0)
+      return;
+    for (std::uintptr_t a = lineOf(p); a <= lineOf(static_cast<const char*>(p) + size - 1);
+         a += kLine)
+      read(reinterpret_cast<const void*>(a));
+  }
+  static void writeAll(const void* p, std::size_t size) {
+    if (size == 0)
+      return;
+    for (std::uintptr_t a = lineOf(p); a <= lineOf(static_cast<const char*>(p) + size - 1);
+         a += kLine)
+      write(reinterpret_cast<const void*>(a));
+  }
+
+private:
+  static constexpr std::uintptr_t kLine = 64;
+  static std::uintptr_t lineOf(const void* p) {
+    return reinterpret_cast<std::uintptr_t>(p) & ~(kLine - 1);
   }
 };
 
