@@ -578,6 +578,73 @@ TEST_F(GenericCallGraphTest, ConstructAgreesWithEnteringEachUseInTurn) {
   EXPECT_TRUE(messageNumbers().empty());
 }
 
+// What a graph says of each function, independent of the order its nodes were made in:
+// the edges in creation order, each node's out- and in-edges in order, the sets.
+struct FunctionView {
+  Infos outs, ins;
+  std::set<KvCCallOperation*> calls;
+  std::set<KvCParamSymbol*> called;
+  bool operator==(const FunctionView&) const = default;
+};
+std::pair<Edges, std::map<KvCFcgFunctionInfo*, FunctionView>>
+viewOf(const KvCGenericFunctionCallGraph& g) {
+  std::map<KvCFcgFunctionInfo*, FunctionView> views;
+  for (leda::node v : g.all_nodes()) {
+    FunctionView& view = views[g.inf(v)];
+    for (leda::edge e : g.out_edges(v))
+      view.outs.push_back(g.inf(g.target(e)));
+    for (leda::edge e : g.in_edges(v))
+      view.ins.push_back(g.inf(g.source(e)));
+    view.calls = callsOf(g.inf(v)->getSymbol());
+    view.called = calledOf(g.inf(v)->getSymbol());
+  }
+  return {edgesOf(g), views};
+}
+
+TEST_F(GenericCallGraphTest, ReconstructionAfterTheApplicationGrewAgreesWithAFreshGraph) {
+  // One graph lives through three versions of the application (functions and calls
+  // added, functions passed as arguments) and is reconstructed each time, once after a
+  // shutdown; a new graph constructed on the same version must say the same.
+  std::mt19937_64 rng(11);
+  auto pick = [&](std::size_t bound) { return static_cast<std::size_t>(rng() % bound); };
+  std::vector<KvCParamSymbol*> functions;
+  KvCFunctionCallGraph kept;
+  for (int version = 0; version < 3; ++version) {
+    SCOPED_TRACE("version " + std::to_string(version));
+    for (int i = 0; i < 40; ++i)
+      functions.push_back(fn(std::string("v")
+                                 .append(std::to_string(version))
+                                 .append("_")
+                                 .append(std::to_string(i))
+                                 .c_str()));
+    for (int k = 0; k < 300; ++k) {
+      KvCParamSymbol* from = functions[pick(functions.size())];
+      KvCParamSymbol* to = functions[pick(functions.size())];
+      KV_ExprLocation* loc = pick(4) == 0 ? callPassing(app, to, functions[pick(functions.size())])
+                             : pick(9) == 0 ? app.taskActivation(to)
+                                            : app.call(to, {app.constant(1)});
+      app.functionBuilder(from->getName().c_str()).body().stmt(loc);
+    }
+    buildDatabases();
+    if (version == 2)
+      ASSERT_TRUE(kept.shutdown());
+    ASSERT_TRUE(kept.construct(false));
+    const auto reconstructed = viewOf(kept);
+    forgetSets(functions);
+    KvCFunctionCallGraph fresh;
+    ASSERT_TRUE(fresh.construct(false));
+    EXPECT_EQ(viewOf(fresh), reconstructed);
+    EXPECT_EQ(kept.number_of_nodes(), fresh.number_of_nodes());
+    // The kept graph's lookups find the new edges.
+    for (const EdgeRow& row : reconstructed.first) {
+      leda::edge e = nullptr;
+      ASSERT_TRUE(kept.getEdge(std::get<0>(row), std::get<1>(row), e));
+    }
+    fresh.shutdown();
+  }
+  EXPECT_TRUE(messageNumbers().empty());
+}
+
 } // namespace
 
 namespace {
