@@ -9,7 +9,6 @@
 #define HUL_PLATFORM_SUPPORT_KVCPREFETCH_H
 
 #include <cstddef>
-#include <cstdint>
 
 struct KvCPrefetch {
   // Hints that the line holding `p` will be read (write: written) soon. Never faults.
@@ -22,27 +21,24 @@ struct KvCPrefetch {
     asm volatile("" : : "r"(p));
   }
   // The same for every line of the `size` bytes at `p` (an object that may straddle
-  // lines); nothing for size 0.
+  // lines): one hint per line-sized step and one for the last byte; nothing for size 0.
   static void readAll(const void* p, std::size_t size) {
-    if (size == 0)
-      return;
-    for (std::uintptr_t a = lineOf(p); a <= lineOf(static_cast<const char*>(p) + size - 1);
-         a += kLine)
-      read(reinterpret_cast<const void*>(a));
+    const char* first = static_cast<const char*>(p);
+    for (std::size_t at = 0; at < size; at += kLine)
+      read(first + at);
+    if (size != 0)
+      read(first + size - 1);
   }
   static void writeAll(const void* p, std::size_t size) {
-    if (size == 0)
-      return;
-    for (std::uintptr_t a = lineOf(p); a <= lineOf(static_cast<const char*>(p) + size - 1);
-         a += kLine)
-      write(reinterpret_cast<const void*>(a));
+    const char* first = static_cast<const char*>(p);
+    for (std::size_t at = 0; at < size; at += kLine)
+      write(first + at);
+    if (size != 0)
+      write(first + size - 1);
   }
 
 private:
-  static constexpr std::uintptr_t kLine = 64;
-  static std::uintptr_t lineOf(const void* p) {
-    return reinterpret_cast<std::uintptr_t>(p) & ~(kLine - 1);
-  }
+  static constexpr std::size_t kLine = 64;
 };
 
 #endif

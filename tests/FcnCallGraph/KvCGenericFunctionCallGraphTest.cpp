@@ -626,8 +626,9 @@ TEST_F(GenericCallGraphTest, ReconstructionAfterTheApplicationGrewAgreesWithAFre
       app.functionBuilder(from->getName().c_str()).body().stmt(loc);
     }
     buildDatabases();
-    if (version == 2)
+    if (version == 2) {
       ASSERT_TRUE(kept.shutdown());
+    }
     ASSERT_TRUE(kept.construct(false));
     const auto reconstructed = viewOf(kept);
     forgetSets(functions);
