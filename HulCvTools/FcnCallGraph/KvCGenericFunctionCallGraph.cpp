@@ -226,8 +226,18 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
   incomplete = false;
   restore_all_edges();
   deleteAllEdges();
-  deleteAllNodes();
   KvCCodeViewData* data = KvCCodeViewData::getCurrent();
+  // The library's own graphs keep the base's hooks. Their edge hook's whole work (the
+  // task mark) construction does itself from what it read with the rest of the call.
+  plainEdgeHook = typeid(*this) == typeid(KvCGenericFunctionCallGraph) ||
+                  typeid(*this) == typeid(KvCFunctionCallGraph);
+  // Their node info hook only empties the info's set of call operations: that is done
+  // when the run first adds to the set (the info is fetched then anyway), or at its end.
+  clearSetsLazily = plainEdgeHook && data != nullptr;
+  if (clearSetsLazily)
+    setCleared.assign(static_cast<std::size_t>(max_node_index() + 1), 0);
+  else
+    deleteAllNodes();
   if (!KV_VERIFY(data != nullptr, "KvCGenericFunctionCallGraph", __LINE__)) {
     incomplete = true;
     return false;
@@ -251,11 +261,7 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
   // once at its end.
   edgeIndexCurrent = false;
   constructing = true;
-  // The library's own graphs keep the base's edge hook, whose whole work (the task mark)
-  // construction then does itself from what it read with the rest of the call.
-  plainEdgeHook = typeid(*this) == typeid(KvCGenericFunctionCallGraph) ||
-                  typeid(*this) == typeid(KvCFunctionCallGraph);
-  // Their hooks do not look at the graph either, so new edges join their calling
+  // The base's hooks do not look at the graph, so new edges join their calling
   // functions' out-edges at the end of the run, calling function by calling function.
   deferOutLinks = plainEdgeHook;
   std::size_t listed = 0;
@@ -269,6 +275,7 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
     treatFcnSymbols(functions);
   }
   flushGroupCalls();
+  clearCallOperationsLeft();
   linkPendingOutEdges();
   deferOutLinks = false;
   constructing = false;
@@ -567,6 +574,8 @@ void KvCGenericFunctionCallGraph::replaySteps() {
       enterEdge(step);
       break;
     case Step::kCall:
+      // addCall may add to any set.
+      clearCallOperationsLeft();
       addCall(step.call);
       break;
     default:
@@ -648,6 +657,7 @@ void KvCGenericFunctionCallGraph::enterEdge(const Step& step) {
     groupCalls.push_back(step.call);
     groupSerials.push_back(step.serial);
   } else {
+    clearCallOperationsOnce(step.w, step.called);
     step.called->addCallOperation(step.call);
   }
   if (!step.selfCall) {
@@ -676,6 +686,8 @@ void KvCGenericFunctionCallGraph::beginGroup(const Step& step) {
   // The table holds every edge into w: those made before (by calls that reached w through
   // another symbol's uses) are entered now, those made during the group as they are made.
   flushGroupCalls();
+  if (info)
+    clearCallOperationsOnce(w, info);
   groupInfo = info;
   // The info's own symbol is almost always the step's function, whose index is known.
   groupCalledSymbol = info ? info->getSymbol() : nullptr;
@@ -1025,6 +1037,42 @@ void KvCGenericFunctionCallGraph::removeCalledEdges(KvCFcgFunctionInfo* function
       called->getCallOperationsSet().clear();
     deleteEdge(e);
   }
+}
+
+void KvCGenericFunctionCallGraph::clearCallOperationsOnce(leda::node v,
+                                                          KvCFcgFunctionInfo* function) {
+  if (!clearSetsLazily)
+    return;
+  const auto at = static_cast<std::size_t>(index(v));
+  if (at >= setCleared.size() || setCleared[at])
+    return;
+  setCleared[at] = 1;
+  deleteFcgNodeInfo(function);
+}
+
+void KvCGenericFunctionCallGraph::clearCallOperationsLeft() {
+  if (!clearSetsLazily)
+    return;
+  clearSetsLazily = false;
+  // The infos lie scattered; each is fetched a few nodes ahead.
+  constexpr int kAhead = 8;
+  auto left = [this](leda::node v) {
+    const auto at = static_cast<std::size_t>(index(v));
+    return at < setCleared.size() && !setCleared[at];
+  };
+  leda::node lead = first_node();
+  for (int i = 0; i < kAhead && lead; ++i)
+    lead = succ_node(lead);
+  for (leda::node v = first_node(); v; v = succ_node(v)) {
+    if (lead) {
+      if (left(lead))
+        KvCPrefetch::read(inf(lead));
+      lead = succ_node(lead);
+    }
+    if (left(v))
+      deleteFcgNodeInfo(inf(v));
+  }
+  setCleared = std::vector<char>();
 }
 
 void KvCGenericFunctionCallGraph::deleteAllEdges() {

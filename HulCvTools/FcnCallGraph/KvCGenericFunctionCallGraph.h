@@ -27,10 +27,11 @@
 // hooks, each hook kind in the order addCall would call it. A function's call operations
 // go to its set once its uses are entered, and the called functions to the calling
 // functions' sets at the end of the run: hooks must not rely on those sets during
-// construction. For the library's own graph types, whose edge hook is the base's,
-// construction sets the task mark itself. Edges are found through a table of the current
-// function's callers while the run lasts; the edge index is filled once at its end.
-// Cost: O(uses + functions) expected.
+// construction. For the library's own graph types, whose hooks are the base's,
+// construction sets the task mark itself and empties a node's set of call operations when
+// it first adds to it (or at the end of the run) instead of all sets first. Edges are found through
+// a table of the current function's callers while the run lasts; the edge index is filled once at
+// its end. Cost: O(uses + functions) expected.
 #ifndef HULCVTOOLS_FCNCALLGRAPH_KVCGENERICFUNCTIONCALLGRAPH_H
 #define HULCVTOOLS_FCNCALLGRAPH_KVCGENERICFUNCTIONCALLGRAPH_H
 
@@ -192,6 +193,11 @@ private:
   // returns its debug index.
   int enterFunctionSlot(KvCParamSymbol* function);
   struct FunctionSlot;
+  // While the run empties call-operation sets lazily (see construct): empties the set of
+  // `function`, whose node is v, unless the run did already or v is new.
+  void clearCallOperationsOnce(leda::node v, KvCFcgFunctionInfo* function);
+  // Empties the sets the run has not emptied yet, and ends lazy emptying.
+  void clearCallOperationsLeft();
   // Fetches the slot of `function` into the cache.
   void prefetchFunctionSlot(const KvCParamSymbol* function) const;
   // Whether the slot of `function` names its node (a guess for prefetching: the info is
@@ -301,6 +307,10 @@ private:
     std::uint32_t run = 0;
   };
   std::vector<FunctionSlot> functionSlots;
+  // While construct empties the call-operation sets of the nodes it found lazily: by node
+  // index, whether the run emptied the node's set (nodes made by the run are past the end).
+  bool clearSetsLazily = false;
+  std::vector<char> setCleared;
   std::uint32_t constructRun = 0;
   // Called functions still to be added to their calling function's set: construction adds
   // them calling function by calling function, which loads each set once instead of once

@@ -144,6 +144,10 @@ TEST_F(GenericCallGraphTest, OnlySelectedVisitsTheUsesOfSelectedFunctions) {
   EXPECT_EQ(nodesOf(graph), (Infos{info("f"), info("h"), info("g")})) << "nodes are reused";
   EXPECT_EQ(edgesOf(graph),
             (Edges{{info("f"), info("g"), 1, false}, {info("g"), info("h"), 1, false}}));
+  EXPECT_EQ(callsOf(fn("g")).size(), 1u);
+  ASSERT_TRUE(graph.construct(true));
+  EXPECT_TRUE(callsOf(fn("g")).empty()) << "g has a node, but its uses are not entered";
+  EXPECT_EQ(callsOf(fn("h")).size(), 1u);
 }
 
 TEST_F(GenericCallGraphTest, EdgeWithATaskActivationIsATaskCallInEitherOrder) {
@@ -628,6 +632,12 @@ TEST_F(GenericCallGraphTest, ReconstructionAfterTheApplicationGrewAgreesWithAFre
     buildDatabases();
     if (version == 2) {
       ASSERT_TRUE(kept.shutdown());
+    } else {
+      // What the graph's functions' sets hold before a reconstruction must go.
+      KvCCallOperation* stray =
+          app.factories().getOperationFactory()->createCallOperation(functions[0], {});
+      for (leda::node v : kept.all_nodes())
+        kept.inf(v)->addCallOperation(stray);
     }
     ASSERT_TRUE(kept.construct(false));
     const auto reconstructed = viewOf(kept);
@@ -644,6 +654,25 @@ TEST_F(GenericCallGraphTest, ReconstructionAfterTheApplicationGrewAgreesWithAFre
     fresh.shutdown();
   }
   EXPECT_TRUE(messageNumbers().empty());
+}
+
+TEST_F(GenericCallGraphTest, CallReachedOnlyThroughAPassedFunctionStaysInTheCalledSet) {
+  // f calls g passing h; g has a node from the first construction but is not listed by
+  // the second, which reaches the call through h's uses only.
+  fn("f");
+  KvCParamSymbol* g = fn("g");
+  KvCParamSymbol* h = fn("h");
+  app.functionBuilder("f").body().stmt(callPassing(app, g, h));
+  buildDatabases();
+  ASSERT_TRUE(graph.construct(false));
+  ASSERT_EQ(callsOf(g).size(), 1u);
+  const std::set<KvCCallOperation*> calls = callsOf(g);
+  g->setSelected(false);
+  ASSERT_TRUE(graph.construct(true));
+  EXPECT_EQ(callsOf(g), calls);
+  leda::edge e = nullptr;
+  ASSERT_TRUE(graph.getEdge(info("f"), infoOf(g), e));
+  EXPECT_EQ(graph.inf(e)->getCardinality(), 1);
 }
 
 } // namespace
