@@ -28,10 +28,10 @@
 // go to its set once its uses are entered, and the called functions to the calling
 // functions' sets at the end of the run: hooks must not rely on those sets during
 // construction. For the library's own graph types, whose hooks are the base's,
-// construction sets the task mark itself and empties a node's set of call operations when
-// it first adds to it (or at the end of the run) instead of all sets first. Edges are found through
-// a table of the current function's callers while the run lasts; the edge index is filled once at
-// its end. Cost: O(uses + functions) expected.
+// construction sets the task mark itself and empties a node's set of call operations
+// when it first adds to it (or at the end of the run) instead of all sets first. Edges
+// are found through a table of the current function's callers while the run lasts; the
+// edge index is filled once at its end. Cost: O(uses + functions) expected.
 #ifndef HULCVTOOLS_FCNCALLGRAPH_KVCGENERICFUNCTIONCALLGRAPH_H
 #define HULCVTOOLS_FCNCALLGRAPH_KVCGENERICFUNCTIONCALLGRAPH_H
 
