@@ -9,6 +9,7 @@
 #include "platform/support/KvCPrefetch.h"
 
 #include <algorithm>
+#include <cassert>
 #include <cstdint>
 #include <typeinfo>
 #include <utility>
@@ -108,11 +109,7 @@ public:
   // table is written front to back instead of at random: O(edges), cache friendly.
   void rebuild() {
     clear();
-    std::size_t edges = 0;
-    for (leda::edge e : graph.all_edges()) {
-      (void)e;
-      ++edges;
-    }
+    const auto edges = static_cast<std::size_t>(graph.number_of_all_edges());
     std::size_t size = 64;
     while ((edges + 1) * 4 > size * 3)
       size *= 2;
@@ -127,6 +124,7 @@ public:
       const leda::node v = graph.source(e);
       const leda::node w = graph.target(e);
       const auto h = static_cast<std::uint32_t>(home(v, w));
+      assert(k < edges && "the graph counts every edge it lists");
       pending[k++] = Pending{h, Slot{v, w, e}};
       ++start[(h >> shift) + 1];
     }

@@ -376,6 +376,8 @@ public:
 
   int number_of_nodes() const { return nodeCount_; }
   int number_of_edges() const { return edgeCount_ - static_cast<int>(hidden_.size()); }
+  // Hidden edges included (as all_edges lists them).
+  int number_of_all_edges() const { return edgeCount_; }
   bool empty() const { return nodeCount_ == 0; }
 
   int index(node v) const { return v->id; }
