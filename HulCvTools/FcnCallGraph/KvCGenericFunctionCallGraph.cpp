@@ -232,9 +232,10 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
   // Their node info hook only empties the info's set of call operations: that is done
   // when the run first adds to the set (the info is fetched then anyway), or at its end.
   clearSetsLazily = plainEdgeHook && data != nullptr;
-  if (clearSetsLazily)
+  if (clearSetsLazily) {
     setCleared.assign(static_cast<std::size_t>(max_node_index() + 1), 0);
-  else
+    setsLeft = setCleared.size();
+  } else
     deleteAllNodes();
   if (!KV_VERIFY(data != nullptr, "KvCGenericFunctionCallGraph", __LINE__)) {
     incomplete = true;
@@ -1045,6 +1046,7 @@ void KvCGenericFunctionCallGraph::clearCallOperationsOnce(leda::node v,
   if (at >= setCleared.size() || setCleared[at])
     return;
   setCleared[at] = 1;
+  --setsLeft;
   deleteFcgNodeInfo(function);
 }
 
@@ -1052,6 +1054,12 @@ void KvCGenericFunctionCallGraph::clearCallOperationsLeft() {
   if (!clearSetsLazily)
     return;
   clearSetsLazily = false;
+  if (setsLeft == 0) {
+    // The usual case: the run added to every set it found (each listed function starts
+    // its group by emptying its own).
+    setCleared = std::vector<char>();
+    return;
+  }
   // The infos lie scattered; each is fetched a few nodes ahead.
   constexpr int kAhead = 8;
   auto left = [this](leda::node v) {

@@ -311,6 +311,7 @@ private:
   // index, whether the run emptied the node's set (nodes made by the run are past the end).
   bool clearSetsLazily = false;
   std::vector<char> setCleared;
+  std::size_t setsLeft = 0; // entries of setCleared still 0
   std::uint32_t constructRun = 0;
   // Called functions still to be added to their calling function's set: construction adds
   // them calling function by calling function, which loads each set once instead of once
