@@ -235,8 +235,9 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
   if (clearSetsLazily) {
     setCleared.assign(static_cast<std::size_t>(max_node_index() + 1), 0);
     setsLeft = setCleared.size();
-  } else
+  } else {
     deleteAllNodes();
+  }
   if (!KV_VERIFY(data != nullptr, "KvCGenericFunctionCallGraph", __LINE__)) {
     incomplete = true;
     return false;
