@@ -100,20 +100,17 @@ void BM_Construct(benchmark::State& state) {
   graph.shutdown();
 }
 // Args: call operations, scheduler shape (1) or fan-out shape (0), ConstructMode.
-BENCHMARK(BM_Construct)
-    ->Args({10'000, 0, kWarmReconstruction})
-    ->Args({100'000, 0, kWarmReconstruction})
-    ->Args({1'000'000, 0, kWarmReconstruction})
-    ->Args({10'000, 1, kWarmReconstruction})
-    ->Args({100'000, 1, kWarmReconstruction})
-    ->Args({10'000, 0, kColdReconstruction})
-    ->Args({100'000, 0, kColdReconstruction})
-    ->Args({1'000'000, 0, kColdReconstruction})
-    ->Args({10'000, 1, kColdReconstruction})
-    ->Args({100'000, 1, kColdReconstruction})
-    ->Args({10'000, 0, kFirstConstruction})
-    ->Args({1'000'000, 0, kFirstConstruction})
-    ->Unit(benchmark::kMillisecond);
+void constructArgs(benchmark::internal::Benchmark* b) {
+  for (long mode : {kWarmReconstruction, kColdReconstruction}) {
+    for (long calls : {10'000, 100'000, 1'000'000})
+      b->Args({calls, 0, mode});
+    for (long calls : {10'000, 100'000})
+      b->Args({calls, 1, mode});
+  }
+  for (long calls : {10'000, 1'000'000})
+    b->Args({calls, 0, kFirstConstruction});
+}
+BENCHMARK(BM_Construct)->Apply(constructArgs)->Unit(benchmark::kMillisecond);
 
 void BM_AnalyzeInlining(benchmark::State& state) {
   SyntheticAppShape shape = callsShape(state.range(0), false);

@@ -22,23 +22,18 @@ struct KvCPrefetch {
   }
   // The same for every line of the `size` bytes at `p` (an object that may straddle
   // lines): one hint per line-sized step and one for the last byte; nothing for size 0.
-  static void readAll(const void* p, std::size_t size) {
-    const char* first = static_cast<const char*>(p);
-    for (std::size_t at = 0; at < size; at += kLine)
-      read(first + at);
-    if (size != 0)
-      read(first + size - 1);
-  }
-  static void writeAll(const void* p, std::size_t size) {
-    const char* first = static_cast<const char*>(p);
-    for (std::size_t at = 0; at < size; at += kLine)
-      write(first + at);
-    if (size != 0)
-      write(first + size - 1);
-  }
+  static void readAll(const void* p, std::size_t size) { eachLine<read>(p, size); }
+  static void writeAll(const void* p, std::size_t size) { eachLine<write>(p, size); }
 
 private:
   static constexpr std::size_t kLine = 64;
+  template <void (*hint)(const void*)> static void eachLine(const void* p, std::size_t size) {
+    const char* first = static_cast<const char*>(p);
+    for (std::size_t at = 0; at < size; at += kLine)
+      hint(first + at);
+    if (size != 0)
+      hint(first + size - 1);
+  }
 };
 
 #endif
