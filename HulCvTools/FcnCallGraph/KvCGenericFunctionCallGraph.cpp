@@ -490,7 +490,7 @@ int KvCGenericFunctionCallGraph::enterFunctionSlot(KvCParamSymbol* function) {
   const leda::node known = entry.info == info ? entry.node : nullptr;
   entry = FunctionSlot{function, info, known, constructRun};
   if (info && !known)
-    entry.node = std::as_const(nodes)[info];
+    existingNodeOf(info, index); // looks the node up and keeps it in the slot
   return index;
 }
 
@@ -1061,24 +1061,7 @@ void KvCGenericFunctionCallGraph::clearCallOperationsLeft() {
     setCleared = std::vector<char>();
     return;
   }
-  // The infos lie scattered; each is fetched a few nodes ahead.
-  constexpr int kAhead = 8;
-  auto left = [this](leda::node v) {
-    const auto at = static_cast<std::size_t>(index(v));
-    return at < setCleared.size() && !setCleared[at];
-  };
-  leda::node lead = first_node();
-  for (int i = 0; i < kAhead && lead; ++i)
-    lead = succ_node(lead);
-  for (leda::node v = first_node(); v; v = succ_node(v)) {
-    if (lead) {
-      if (left(lead))
-        KvCPrefetch::read(inf(lead));
-      lead = succ_node(lead);
-    }
-    if (left(v))
-      deleteFcgNodeInfo(inf(v));
-  }
+  deleteNodeInfos(&setCleared);
   setCleared = std::vector<char>();
 }
 
@@ -1094,7 +1077,15 @@ void KvCGenericFunctionCallGraph::deleteAllEdges() {
   groupNode = nullptr;
 }
 
-void KvCGenericFunctionCallGraph::deleteAllNodes() {
+void KvCGenericFunctionCallGraph::deleteAllNodes() { deleteNodeInfos(nullptr); }
+
+void KvCGenericFunctionCallGraph::deleteNodeInfos(const std::vector<char>* done) {
+  auto wanted = [this, done](leda::node v) {
+    if (!done)
+      return true;
+    const auto at = static_cast<std::size_t>(index(v));
+    return at < done->size() && !(*done)[at];
+  };
   // The infos lie scattered; each is fetched a few nodes ahead.
   constexpr int kAhead = 8;
   leda::node lead = first_node();
@@ -1102,10 +1093,12 @@ void KvCGenericFunctionCallGraph::deleteAllNodes() {
     lead = succ_node(lead);
   for (leda::node v = first_node(); v; v = succ_node(v)) {
     if (lead) {
-      KvCPrefetch::read(inf(lead));
+      if (wanted(lead))
+        KvCPrefetch::read(inf(lead));
       lead = succ_node(lead);
     }
-    deleteFcgNodeInfo(inf(v));
+    if (wanted(v))
+      deleteFcgNodeInfo(inf(v));
   }
 }
 

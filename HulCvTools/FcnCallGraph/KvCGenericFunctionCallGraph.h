@@ -198,6 +198,9 @@ private:
   void clearCallOperationsOnce(leda::node v, KvCFcgFunctionInfo* function);
   // Empties the sets the run has not emptied yet, and ends lazy emptying.
   void clearCallOperationsLeft();
+  // Calls the node info hook for every node (done null) or for the nodes of the run's
+  // start (index below done's size) not marked in done, fetching infos ahead.
+  void deleteNodeInfos(const std::vector<char>* done);
   // Fetches the slot of `function` into the cache.
   void prefetchFunctionSlot(const KvCParamSymbol* function) const;
   // Whether the slot of `function` names its node (a guess for prefetching: the info is
