@@ -6,15 +6,6 @@
 
 HULCV_DEFINE_HEAP_OPERATORS(KvCFunctionCallGraph)
 
-KvCFcgReInitInlining::~KvCFcgReInitInlining() = default;
-
-void KvCFcgReInitInlining::operator()(KvCFcgFunctionInfo* function) {
-  if (function)
-    function->unmarkInLoop();
-}
-
-bool KvCFcgReInitInlining::stopIteration() { return false; }
-
 KvCFunctionCallGraph::~KvCFunctionCallGraph() = default;
 
 bool KvCFunctionCallGraph::boot() { return true; }

@@ -1,37 +1,44 @@
 // KvCGenericFunctionCallGraph: the directed call graph of the application: one node per
 // function or macro, one edge per ordered pair (calling, called) linked by at least one
-// call operation, the edge's cardinality counting those operations. A self-recursive
-// call is a self-loop. Built from the ICode (construct, from the uses in the def/use
+// call operation, the edge's cardinality counting those operations. A self-recursive call
+// is a self-loop. Built from the ICode by construct (from the uses listed in the def/use
 // databases, which must be built first), then kept up to date call by call (addCall,
 // delCall), and walked with functors.
 //
-// Ownership: node payloads are the model's function infos, which the graph never frees;
-// nodes once made stay until shutdown of a derived graph (a new construct reuses them).
-// Edge infos belong to the graph (createFcgEdgeInfo / deleteFcgEdgeInfo). Copying is
-// deleted: a copied node map would point into the source graph.
+// What it does not do: it never looks inside function bodies itself (the calls are found
+// through the called symbols' uses), and it never frees model objects.
 //
-// Lookups are O(1): next to the node map the graph keeps an index from (calling node,
-// called node) to the pair's edges, so a scheduler calling N functions is entered in
-// O(N). getEdge answers what a scan of the caller's visible out-edges would: the first
-// visible edge to the called node in creation order (a pair has two edges only when a
-// call was added while the pair's edge was hidden).
+// Ownership:
+// - Node payloads are the model's function infos, which the graph never frees. Nodes,
+//   once made, stay for the life of the graph (a new construct reuses them) until a derived
+//   graph clears the graph at its shutdown.
+// - Every edge payload belongs to the graph, however the edge was made: it is created by
+//   createFcgEdgeInfo and released by deleteFcgEdgeInfo when its edge goes, whether the edge
+//   is deleted by this class, by a derived graph or through the inherited graph operations
+//   (del_edge, del_node, del_all_edges, clear). Infos made by the base hook come from a pool
+//   the graph owns; the destructor releases every info that is left.
+// - Copying is deleted: a copied node map would name the source graph's nodes.
 //
-// The virtual hooks let derived graphs (recursion analysis, reuse graph) change what the
-// nodes and edges carry.
+// Lookups stay exact whatever the inherited graph operations do, because nothing is cached
+// beside the graph except the node map, which the graph's update handlers keep in step when
+// nodes go (del_node, clear):
+// - getNode: one hashed lookup in the node map.
+// - getEdge: scans the shorter of the calling node's out-edges and the called node's
+//   in-edges (both in creation order, hidden edges skipped), so it costs
+//   O(min(out-degree, in-degree)): a scheduler calling thousands of functions each once
+//   finds every edge at the called function's single in-edge.
 //
-// construct gives the graph and the function infos that entering every use's call with
-// addCall in symbol order would give (same nodes, edges, edge and adjacency orders, sets).
-// It reads the uses' calls from the model in memory order first (asking
-// provideFcgNodeInfo in that order; it must answer the same for a symbol throughout a run),
-// then enters them in symbol order in batches: node hooks of a batch run before its edge
-// hooks, each hook kind in the order addCall would call it. A function's call operations
-// go to its set once its uses are entered, and the called functions to the calling
-// functions' sets at the end of the run: hooks must not rely on those sets during
-// construction. For the library's own graph types, whose hooks are the base's,
-// construction sets the task mark itself and empties a node's set of call operations
-// when it first adds to it (or at the end of the run) instead of all sets first. Edges
-// are found through a table of the current function's callers while the run lasts; the
-// edge index is filled once at its end. Cost: O(uses + functions) expected.
+// Hooks: construct visits the function and macro symbols in the symbol database's order;
+// for each it calls provideFcgNodeInfo, registers the node and calls
+// synchronizeNodeInfoAtConstruction, then enters the calls among the symbol's uses one by
+// one, in ascending key order, exactly as addCall enters them (provideFcgNodeInfo for
+// both ends, createFcgEdgeInfo for a new edge, synchronizeEdgeInfoAtConstruction). The same
+// order holds for every graph type. Hooks may read the graph; deleteFcgEdgeInfo, which may
+// be called from inside a graph operation, must not change it.
+//
+// Cost: construct is O(symbols + uses * (1 + edge scan)) expected; addCall and delCall
+// O(1) expected plus the edge scan. Memory: the graph's node and edge records, one pooled
+// edge info per edge and one node-map entry per function.
 #ifndef HULCVTOOLS_FCNCALLGRAPH_KVCGENERICFUNCTIONCALLGRAPH_H
 #define HULCVTOOLS_FCNCALLGRAPH_KVCGENERICFUNCTIONCALLGRAPH_H
 
@@ -45,13 +52,10 @@
 #include "platform/leda/map.h"
 #include "platform/leda/set.h"
 
-#include <cstddef>
-#include <cstdint>
 #include <memory>
 #include <vector>
 
 class KvCFcnSmbVisitor;
-class KvCFcgEdgeIndex;
 class KvCObjectPool;
 
 // The graph of every call graph: instantiated (and exported) once, by the library.
@@ -61,16 +65,20 @@ using KvCFcgGraph = leda::GRAPH<KvCFcgFunctionInfo*, KvCFcgEdgeInfo*>;
 class HULCV_API KvCGenericFunctionCallGraph : public KvCFcgGraph {
 public:
   KvCGenericFunctionCallGraph();
-  // Releases the edge infos; the function infos are the model's.
+  // Releases the edge infos that are left (through this class's deleteFcgEdgeInfo: a
+  // derived graph whose infos need its own hook releases them in its shutdown).
   ~KvCGenericFunctionCallGraph() override;
   KvCGenericFunctionCallGraph(const KvCGenericFunctionCallGraph&) = delete;
   KvCGenericFunctionCallGraph& operator=(const KvCGenericFunctionCallGraph&) = delete;
 
-  // Rebuilds the edges from the ICode: every function or macro symbol (only the selected
-  // ones when `onlySelected`) gets a node, and every use of it that is the called symbol
-  // of a call operation enters that call. False when a use had no operation (the graph
-  // built so far stays usable). Needs the run's current code view data.
+  // Rebuilds the edges from the ICode of the run's current code view data: restores hidden
+  // edges, deletes every edge, empties every node's function info (deleteFcgNodeInfo), then
+  // gives every function or macro symbol (only the selected ones when `onlySelected`) a node
+  // and enters the call operation above each of its uses. False when a use had no operation
+  // or there is no current code view data; the graph built so far stays usable.
   virtual bool construct(bool onlySelected);
+  // Traversals in node order; the first three ask the functor's stopIteration before each
+  // node. A function without node gets no application.
   virtual void forall_FcgNodes(KvCFcgFunctor& functor);
   virtual void forall_CallerNodes(KvCFcgFunctor& functor);
   virtual void forall_CallingFunctionsOf(KvCFcgFunctionInfo* function, KvCFcgFunctor& functor);
@@ -79,18 +87,19 @@ public:
 
   // Enters one call operation: its (calling, called) edge, the call in the called
   // function's set of calls, the called function in the caller's set of called functions.
-  // False, entering nothing, for a call outside every function (after an internal check,
-  // except for access functions and RTE API macros in initial values).
+  // False, entering nothing, for a null call or a call outside every function (after an
+  // internal check, except for access functions and RTE API macros in initial values).
   bool addCall(KvCCallOperation* call);
-  // Takes one call operation out: the edge's cardinality goes down, the edge goes at 0.
-  // False, changing nothing, when the graph has no edge for the call.
+  // Takes one call operation out: the edge's cardinality goes down, the edge goes at 1.
+  // False, changing nothing, when the graph has no visible edge for the call.
   bool delCall(KvCCallOperation* call);
 
   // `node` untouched on false.
   bool getNode(KvCFcgFunctionInfo* function, leda::node& node) const;
-  // `edge` meaningful only on true.
+  // The first visible edge from `calling` to `called` in creation order. `edge` is
+  // meaningful only on true. O(min(out-degree of calling, in-degree of called)).
   bool getEdge(KvCFcgFunctionInfo* calling, KvCFcgFunctionInfo* called, leda::edge& edge) const;
-  // Edges, not call operations; 0 without node.
+  // Visible edges, not call operations; 0 without node.
   int getNrOfCallers(KvCFcgFunctionInfo* function) const;
   int getNrOfCalled(KvCFcgFunctionInfo* function) const;
   // Deletes every edge incident to the function's node; the node stays.
@@ -114,219 +123,60 @@ protected:
   virtual void deleteFcgEdgeInfo(KvCFcgEdgeInfo* info);
   virtual void synchronizeEdgeInfoAtConstruction(KvCFcgEdgeInfo* info, KvCCallOperation* call);
 
-  // Registers both functions and adds one call to their edge; true when the edge is new.
+  // Registers both functions and adds one call to their edge: the existing visible edge's
+  // cardinality goes up (an edge without info gets one first), or a new edge is made with
+  // cardinality 1. True when the edge is new; `edge` is null only when no edge info could
+  // be made.
   bool addEdge(KvCFcgFunctionInfo* calling, KvCFcgFunctionInfo* called, leda::edge& edge);
+  // Registers both functions and makes a new edge between them with a new edge info of
+  // cardinality 1, even when the pair has an edge already (parallel edges, for derived
+  // graphs that keep one edge per pair of instances). False, `edge` null, for a null
+  // function or when no edge info could be made.
+  bool addNewEdge(KvCFcgFunctionInfo* calling, KvCFcgFunctionInfo* called, leda::edge& edge);
   void registerNode(KvCFcgFunctionInfo* function);
-  // Deletes every edge (restoring hidden ones first) and its info.
+  // Restores hidden edges, then deletes every edge after passing its info to
+  // deleteFcgEdgeInfo, in edge order.
   void deleteAllEdges();
-  // Passes every node's info to deleteFcgNodeInfo; nodes and map stay.
+  // Passes every node's info to deleteFcgNodeInfo, in node order; nodes and map stay.
   void deleteAllNodes();
-  // Deletes one edge and its info.
+  // Deletes one edge after passing its info to deleteFcgEdgeInfo.
   void deleteEdge(leda::edge e);
 
   leda::map<KvCFcgFunctionInfo*, leda::node>& nodeMap() { return nodes; }
   bool isIncomplete() const { return incomplete; }
   // Forgets every node (for a derived graph's shutdown, together with clear()).
-  void clearNodeMap();
+  void clearNodeMap() { nodes.clear(); }
+
+  // Update handlers of the graph: whatever deletes an edge releases its info, and the node
+  // map forgets nodes that go.
+  void pre_del_edge_handler(leda::edge e) override;
+  void pre_del_node_handler(leda::node v) override;
+  void pre_clear_handler() override;
 
 private:
   friend class KvCFcnSmbVisitor;
 
   void treatFcnSymbolByUses(KvCParamSymbol* function);
-  // Treats the symbols in order as treatFcnSymbolByUses would, prefetching ahead.
-  void treatFcnSymbols(const std::vector<KvCParamSymbol*>& functions);
-  // Enters the call of which `use` is an operand, if any.
-  void enterUse(KV_ExprLocation* use);
-
-  // Construction reads what each use asks for (UseRecord, in memory order), turns the
-  // records into steps in symbol order and carries them out batch by batch, fetching the
-  // graph memory of the steps a few places ahead into the cache meanwhile.
-  struct Step {
-    enum Kind : unsigned char {
-      kNode,       // register `calling` (the info of `function`) and synchronize it
-      kIncomplete, // a use without operation
-      kEdge,       // enter `call` from `calling` to `called`, both known
-      kCall,       // enter `call` through addCall (it has an end missing)
-      kNone        // (use records only) the use is no operand of a call
-    };
-    Kind kind;
-    bool selfCall = false;
-    bool taskCall = false; // kEdge: the call activates a task
-    bool ownCall = false;  // kEdge: `called` is the function whose uses these are
-    // Debug indices of the calling and the called symbol (kNode: of `function`), or -1;
-    // they key the function slots of a construction run.
-    int callingIndex = -1;
-    int calledIndex = -1;
-    int serial = 0;            // kEdge: the call's serial number
-    std::size_t groupUses = 0; // kNode: the number of uses of `function`
-    KvCFcgFunctionInfo* calling = nullptr;
-    KvCFcgFunctionInfo* called = nullptr;
-    KvCParamSymbol* function = nullptr;
-    KvCCallOperation* call = nullptr;
-    // kEdge: the calling and called node, once registered; kNode: the function's node.
-    leda::node v = nullptr;
-    leda::node w = nullptr;
-  };
-  // What one use asks for, read from the model before the steps are made (kEdge: `v` is
-  // the calling node if it existed already; kCall: only `call`).
-  struct UseRecord {
-    Step::Kind kind = Step::kNone;
-    bool selfCall = false;
-    bool taskCall = false;
-    int callingIndex = -1;
-    int serial = 0;
-    KvCCallOperation* call = nullptr;
-    KvCFcgFunctionInfo* calling = nullptr;
-    KvCParamSymbol* calledSymbol = nullptr;
-    leda::node v = nullptr;
-  };
-  // Fills useRecords for useBuffer, reading the uses in address order.
-  void resolveUses();
-  // Fills useOrder: the uses of useBuffer grouped by their address range.
-  void sortUsesByAddress();
-  // The step a use record of `function` (whose info and debug index are given) makes.
-  void pushStep(const UseRecord& record, KvCParamSymbol* function, KvCFcgFunctionInfo* info,
-                int index);
-  // The function's node if it has one (through the function slots), else null.
-  leda::node existingNodeOf(KvCFcgFunctionInfo* function, int index);
-  // Enters a listed function (its info and existing node) in its function slot and
-  // returns its debug index.
-  int enterFunctionSlot(KvCParamSymbol* function);
-  struct FunctionSlot;
-  // While the run empties call-operation sets lazily (see construct): empties the set of
-  // `function`, whose node is v, unless the run did already or v is new.
-  void clearCallOperationsOnce(leda::node v, KvCFcgFunctionInfo* function);
-  // Empties the sets the run has not emptied yet, and ends lazy emptying.
-  void clearCallOperationsLeft();
-  // Calls the node info hook for every node (done null) or for the nodes of the run's
-  // start (index below done's size) not marked in done, fetching infos ahead.
-  void deleteNodeInfos(const std::vector<char>* done);
-  // Fetches the slot of `function` into the cache.
-  void prefetchFunctionSlot(const KvCParamSymbol* function) const;
-  // Whether the slot of `function` names its node (a guess for prefetching: the info is
-  // the symbol's own).
-  bool slotNamesNode(KvCParamSymbol* function) const;
-  // The slot at `index` when it names the info `function` (from any run), else null.
-  FunctionSlot* slotOfInfo(KvCFcgFunctionInfo* function, int index);
-  // The slot of `function` (debug index `index`), or null when it has none.
-  const FunctionSlot* slotOf(const KvCParamSymbol* function, int index) const;
-  // Carries out the recorded steps in order and forgets them.
-  void replaySteps();
-  void prefetchNodes(const Step& step, bool near) const;
-  // The node of `function` through its function slot (debug index `index`), registering
-  // it when missing.
-  leda::node cachedNodeOf(KvCFcgFunctionInfo* function, int index);
-  void prefetchEdge(const Step& step, bool near) const;
-  // addEdge between registered nodes.
-  bool addEdgeBetween(leda::node v, leda::node w, leda::edge& e);
-  void enterEdge(const Step& step);
-  // Creates the edge v -> w with a new info of cardinality 1, entering it in the edge index
-  // (when current) and in the group table (when w is the group's node).
-  leda::edge linkNewEdge(leda::node v, leda::node w);
-  // While constructing: the edge v -> w, or null.
-  leda::edge findConstructedEdge(leda::node v, leda::node w);
-  // Starts the uses of the function of a kNode step (its node is step.v).
-  void beginGroup(const Step& step);
-  // Adds the group's calls to its function's set of call operations.
-  void flushGroupCalls();
-  std::size_t groupHome(leda::node v) const;
-  leda::edge groupFind(leda::node v) const;
-  void groupInsert(leda::node v, leda::edge e);
-  // Fills the edge index from the graph when construction left it behind.
-  void ensureEdgeIndex() const;
-  // A calling function's bucket when construction groups by calling function: its debug
-  // index when it has a function slot, else one shared last bucket.
-  int callerKey(int callingIndex) const;
-  // Appends the edges made with their out-edge links deferred to their sources' lists.
-  void linkPendingOutEdges();
-  // Adds the called functions that construction deferred, grouped by calling function.
-  void addDeferredCalledFcns();
-
-  // The function's node, registered when missing (one map lookup).
+  // Enters the call operation above `use`, if any; a use without operation makes the
+  // construction incomplete.
+  void enterCallAbove(KV_ExprLocation* use);
+  // The function's node, registered when missing.
   leda::node nodeOf(KvCFcgFunctionInfo* function);
-  bool isEnteredOutsideFunctions(KvCCallOperation* call) const;
+  // The first visible edge v -> w, or null.
+  leda::edge findEdge(leda::node v, leda::node w) const;
+  // Passes e's info to deleteFcgEdgeInfo and detaches it from e.
+  void releaseEdgeInfo(leda::edge e);
+  // Whether a call without calling function stands in a symbol's initial value.
+  static bool isInInitialValue(KvCCallOperation* call);
   void forall_CallingFunctionsOf(leda::node v, KvCFcgFunctor& functor);
   void forall_CalledFunctionsOf(leda::node v, KvCFcgFunctor& functor);
 
   leda::map<KvCFcgFunctionInfo*, leda::node> nodes;
   bool incomplete = true;
-  std::unique_ptr<KvCFcgEdgeIndex> edgeIndex;
-  // False while construct runs (the index is filled at its end); every other operation
-  // that uses the index fills it first when it is false.
-  mutable bool edgeIndexCurrent = true;
-  // Storage of the edge infos the base hook makes (the destructor deletes every info
-  // before the pool goes).
+  // Storage of the edge infos the base hook makes.
   std::unique_ptr<KvCObjectPool> edgeInfoPool;
-  // Scratch of construction, reused from run to run: the uses of the symbols being treated.
-  std::vector<KV_ExprLocation*> useBuffer;
-  std::vector<KV_ExprLocation*> listedUses;
-  std::vector<int> listedIndices; // the debug indices of the functions being treated
-  std::vector<Step> steps;
-  std::vector<UseRecord> useRecords;
-  // The uses sorted by address range, each with its place in useBuffer.
-  struct SortedUse {
-    KV_ExprLocation* use;
-    std::uint32_t index;
-  };
-  std::vector<SortedUse> useOrder;
-  std::vector<std::uint32_t> useRangeStart;
-  // While constructing, the edges into the node of the function whose uses are being
-  // entered (groupNode), by calling node: most calls find their edge here, in a table the
-  // size of the function's uses, instead of in the index.
-  struct GroupSlot {
-    leda::node v = nullptr;
-    leda::edge e = nullptr;
-  };
-  bool constructing = false;
-  // The graph's edge hook is the base's (see construct).
-  bool plainEdgeHook = false;
-  // New edges wait in pendingOut for their place in the calling node's out-edges.
-  bool deferOutLinks = false;
-  struct PendingOut {
-    leda::node v;
-    leda::edge e;
-  };
-  std::vector<PendingOut> pendingOut;
-  leda::node groupNode = nullptr;
-  KvCFcgFunctionInfo* groupInfo = nullptr;
-  // groupInfo as an element of a called-function set (see DeferredCalled).
-  int groupCalledIndex = 0;
-  KvCParamSymbol* groupCalledSymbol = nullptr;
-  // The group's calls to its function, with their serial numbers, not yet in its set.
-  std::vector<KvCCallOperation*> groupCalls;
-  std::vector<int> groupSerials;
-  std::vector<GroupSlot> groupSlots;
-  std::size_t groupCount = 0;
-  // By symbol debug index: the symbol listed with that index in construction run `run`,
-  // its info (from provideFcgNodeInfo) and the info's node once known. A slot serves a
-  // symbol only in its run and when it names it, and a node (in any later run, until
-  // clearNodeMap) only for the info it names. Most calls find their calling function here
-  // instead of in the node map, and a reconstruction finds every node here. Kept between
-  // runs: 32 bytes per symbol of the application, twice over for symbols made meanwhile.
-  struct FunctionSlot {
-    KvCParamSymbol* symbol = nullptr;
-    KvCFcgFunctionInfo* info = nullptr;
-    leda::node node = nullptr;
-    std::uint32_t run = 0;
-  };
-  std::vector<FunctionSlot> functionSlots;
-  // While construct empties the call-operation sets of the nodes it found lazily: by node
-  // index, whether the run emptied the node's set (nodes made by the run are past the end).
-  bool clearSetsLazily = false;
-  std::vector<char> setCleared;
-  std::size_t setsLeft = 0; // entries of setCleared still 0
-  std::uint32_t constructRun = 0;
-  // Called functions still to be added to their calling function's set: construction adds
-  // them calling function by calling function, which loads each set once instead of once
-  // per call.
-  struct DeferredCalled {
-    int callingKey;       // the calling function's bucket (callerKey)
-    int calledDebugIndex; // with calledSymbol, the called function as its set keeps it
-    KvCFcgFunctionInfo* calling;
-    KvCParamSymbol* calledSymbol;
-  };
-  std::vector<DeferredCalled> deferredCalled;
-  std::vector<DeferredCalled> deferredByCaller;
+  // The uses of the symbol being treated; kept from symbol to symbol to spare allocations.
+  std::vector<KV_ExprLocation*> uses;
 };
 
 #endif

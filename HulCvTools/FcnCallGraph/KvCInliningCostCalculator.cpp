@@ -6,11 +6,6 @@
 #include <climits>
 #include <cstdint>
 
-void KvCInliningCostStatementCounter::visitStatementTable(KV_StatementTable* table) {
-  if (table)
-    counter += table->getNumberOfStatements();
-}
-
 KvCInliningCostCalculator::~KvCInliningCostCalculator() = default;
 
 int KvCInliningCostCalculator::calculateInliningCosts(int numberOfCalls,

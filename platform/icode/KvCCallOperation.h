@@ -30,8 +30,6 @@ public:
       return callingSymbol;
     return findCallingSymbol();
   }
-  // Whether getCallingSymbol answers without walking.
-  bool isCallingSymbolKnown() const { return callingEpoch == structureEpoch(); }
 
   // The descriptor when the call activates a task, else null. Not owned.
   KvCTaskActivation* getTaskActivation() const { return taskActivation; }

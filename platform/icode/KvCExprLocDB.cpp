@@ -5,7 +5,6 @@
 #include "platform/icode/KV_Statement.h"
 #include "platform/icode/KvCCStmTable.h"
 #include "platform/icode/KvCParamSymbol.h"
-#include "platform/support/KvCPrefetch.h"
 
 #include <algorithm>
 
@@ -87,17 +86,6 @@ void KvCExprLocDB::listUses(std::vector<KV_ExprLocation*>& uses) const {
   std::sort(uses.begin(), uses.end(), [](const KV_ExprLocation* a, const KV_ExprLocation* b) {
     return a->getSerial() < b->getSerial();
   });
-}
-
-void KvCExprLocDB::prefetchUseRecords() const {
-  KvCPrefetch::read(&entries[KV_DB_USE]);
-  KvCPrefetch::read(&entries[KV_DB_QSO_USE]);
-}
-
-void KvCExprLocDB::prefetchUses() const {
-  for (int c = KV_DB_USE; c <= KV_DB_QSO_USE; ++c)
-    if (!entries[c].empty())
-      KvCPrefetch::read(entries[c].data());
 }
 
 void KvCExprLocDB::listCategory(tagKvEExprLocDBCategory category,

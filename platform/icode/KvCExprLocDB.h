@@ -62,10 +62,6 @@ public:
   // O(number of uses) when the uses were entered in ascending serial order (as a walk of the
   // ICode enters them) and none was removed from the middle since; O(n log n) otherwise.
   void listUses(std::vector<KV_ExprLocation*>& uses) const;
-  // Cache hints for a listUses to come, in two stages: the database's own records of its
-  // uses, then (once those are cached) the uses' arrays.
-  void prefetchUseRecords() const;
-  void prefetchUses() const;
   void listCategory(tagKvEExprLocDBCategory category,
                     leda::dictionary<int, KV_ExprLocation*>& entries) const;
 

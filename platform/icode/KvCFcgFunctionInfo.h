@@ -45,17 +45,8 @@ public:
   CalledFunctionSet& getCalledFunctionsSet() { return calledFunctions; }
   // Each answers whether the set changed.
   bool addCallOperation(KvCCallOperation* call);
-  // Adds n call operations given with their serial numbers, as n addCallOperation calls
-  // would. Into an empty set, with strictly ascending serials, the calls are appended
-  // without reading them; otherwise they are inserted one by one.
-  void addCallOperations(KvCCallOperation* const* calls, const int* serials, std::size_t n);
   bool delCallOperation(KvCCallOperation* call);
   bool addCalledFcn(KvCFcgFunctionInfo* called);
-  // The same for a called function already in its set form (see asCalledFunction); a null
-  // symbol changes nothing.
-  bool addCalledFcn(const KvCFcgCalledFunction& called);
-  // This function as an element of a set of called functions.
-  KvCFcgCalledFunction asCalledFunction() const;
 
   bool isInLoop() const { return inLoop; }
   void markInLoop() { inLoop = true; }

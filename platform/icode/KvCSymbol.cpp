@@ -34,33 +34,12 @@ bool KvCFcgFunctionInfo::addCallOperation(KvCCallOperation* call) {
   return call && callOperations.insert(call);
 }
 
-void KvCFcgFunctionInfo::addCallOperations(KvCCallOperation* const* calls, const int* serials,
-                                           std::size_t n) {
-  bool ordered = callOperations.empty();
-  for (std::size_t i = 0; i < n && ordered; ++i)
-    ordered = calls[i] && (i == 0 || serials[i - 1] < serials[i]);
-  if (ordered) {
-    callOperations.appendAscending(calls, n);
-    return;
-  }
-  // A set that kept its elements (most often these very calls): one by one from the front.
-  callOperations.rewind();
-  for (std::size_t i = 0; i < n; ++i)
-    addCallOperation(calls[i]);
-}
-
 bool KvCFcgFunctionInfo::delCallOperation(KvCCallOperation* call) {
   return call && callOperations.del(call);
 }
 
 bool KvCFcgFunctionInfo::addCalledFcn(KvCFcgFunctionInfo* called) {
-  return called && addCalledFcn(called->asCalledFunction());
-}
-
-bool KvCFcgFunctionInfo::addCalledFcn(const KvCFcgCalledFunction& called) {
-  return called.symbol && calledFunctions.insert(called);
-}
-
-KvCFcgCalledFunction KvCFcgFunctionInfo::asCalledFunction() const {
-  return KvCFcgCalledFunction{symbol ? symbol->getDebugIndex() : 0, symbol};
+  KvCParamSymbol* calledSymbol = called ? called->getSymbol() : nullptr;
+  return calledSymbol &&
+         calledFunctions.insert(KvCFcgCalledFunction{calledSymbol->getDebugIndex(), calledSymbol});
 }

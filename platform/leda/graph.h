@@ -18,7 +18,6 @@
 #define HULCVTOOLS_PLATFORM_LEDA_GRAPH_H
 
 #include "platform/leda/array.h"
-#include "platform/support/KvCPrefetch.h"
 
 #include <algorithm>
 #include <cassert>
@@ -247,26 +246,10 @@ public:
   node new_node() { return linkNode(makeNode()); }
   edge new_edge(node v, node w) { return linkEdge(makeEdge(), v, w); }
 
-  // Bulk building, where appending to the source's out-edges one edge at a time would
-  // visit the sources in scattered order: new_edge_out_later (in GRAPH) makes an edge that
-  // is in the edge list and in w's in-edges but not yet in v's out-edges (nor counted in
-  // v's out-degree); link_out_edges then appends such edges to their sources' out-edges,
-  // in the order given (group them by source, each source's in creation order, so the
-  // sources are visited once each). Until then the edge must not be deleted or hidden,
-  // and v's out-edge list and out-degree leave it out.
-  void link_out_edges(const edge* edges, std::size_t n) {
-    // The edges lie scattered; each is fetched (for writing) a few places ahead.
-    constexpr std::size_t kAhead = 16;
-    for (std::size_t i = 0; i < n; ++i) {
-      if (i + kAhead < n)
-        KvCPrefetch::write(edges[i + kAhead]);
-      linkOut(edges[i]);
-    }
-  }
-
   // Deletes v and all its edges, hidden ones included. O(degree).
   void del_node(node v) {
     assert(v);
+    pre_del_node_handler(v);
     while (v->outFirst)
       del_edge(v->outFirst);
     while (v->inFirst)
@@ -280,6 +263,7 @@ public:
   // Deletes e, which may be hidden. O(1).
   void del_edge(edge e) {
     assert(e);
+    pre_del_edge_handler(e);
     if (e->hidden())
       forgetHidden(e);
     else
@@ -294,9 +278,11 @@ public:
     destroyEdge(e);
   }
 
-  // Deletes every edge, hidden ones included; the nodes stay, without edges. O(nodes +
-  // edges), without the per-edge unlinking of del_edge.
+  // Deletes every edge, hidden ones included, in creation order; the nodes stay, without
+  // edges. O(nodes + edges), without the per-edge unlinking of del_edge.
   void del_all_edges() {
+    for (edge e = firstEdge_; e; e = e->next)
+      pre_del_edge_handler(e);
     for (edge e = firstEdge_; e;) {
       edge next = e->next;
       e->~EdgeRec();
@@ -314,6 +300,7 @@ public:
 
   // Deletes all nodes and edges. Indices of later elements keep counting up.
   void clear() {
+    pre_clear_handler();
     for (edge e = firstEdge_; e;) {
       edge next = e->next;
       e->~EdgeRec();
@@ -343,13 +330,6 @@ public:
   }
 
   bool is_hidden(edge e) const { return e->hidden(); }
-  // Cache hints for a new edge out of v to come: v's record, then (once that is cached)
-  // v's last outgoing edge, which the new edge is linked after.
-  static void prefetch_node(node v) { KvCPrefetch::write(v); }
-  static void prefetch_out_end(node v) {
-    if (v->outLast)
-      KvCPrefetch::write(v->outLast);
-  }
 
   void restore_edge(edge e) {
     assert(e);
@@ -446,14 +426,6 @@ protected:
   }
 
   edge linkEdge(detail::EdgeRec* e, node v, node w) {
-    linkEdgeButOut(e, v, w);
-    linkOut(e);
-    return e;
-  }
-
-  // linkEdge without the append to v's out-edges and v's out-degree (see
-  // new_edge_out_later).
-  edge linkEdgeButOut(detail::EdgeRec* e, node v, node w) {
     assert(v && w);
     e->id = nextEdgeId_++;
     e->src = v;
@@ -465,17 +437,23 @@ protected:
     (w->inLast ? w->inLast->inNext : w->inFirst) = e;
     w->inLast = e;
     ++w->indeg;
-    ++edgeCount_;
-    return e;
-  }
-
-  static void linkOut(edge e) {
-    node v = e->src;
     e->outPrev = v->outLast;
     (v->outLast ? v->outLast->outNext : v->outFirst) = e;
     v->outLast = e;
     ++v->outdeg;
+    ++edgeCount_;
+    return e;
   }
+
+  // Update handlers, as the graph library offers them: called before an edge is deleted
+  // (by del_edge, del_node or del_all_edges), before a node is deleted (ahead of its
+  // edges), and before clear() deletes everything. Derived graphs override them to keep
+  // what they hold beside the graph in step; a handler must not add or delete nodes or
+  // edges (showing hidden edges is allowed: they are about to go). The
+  // destructor's clear() calls this class's handlers, which do nothing.
+  virtual void pre_del_edge_handler(edge /*e*/) {}
+  virtual void pre_del_node_handler(node /*v*/) {}
+  virtual void pre_clear_handler() {}
 
 private:
   void destroyNode(node v) {
@@ -523,19 +501,11 @@ public:
   using graph::new_node;
 
   GRAPH() : graph(sizeof(detail::NodeRecOf<V>), sizeof(detail::EdgeRecOf<E>)) {}
-  // Cache hint for the whole record of v (which may straddle lines).
-  static void prefetch_node(node v) { KvCPrefetch::writeAll(v, sizeof(detail::NodeRecOf<V>)); }
-
   node new_node(const V& x) {
     return linkNode(new (nodeMemory(sizeof(detail::NodeRecOf<V>))) detail::NodeRecOf<V>(x));
   }
   edge new_edge(node v, node w, const E& x) {
     return linkEdge(new (edgeMemory(sizeof(detail::EdgeRecOf<E>))) detail::EdgeRecOf<E>(x), v, w);
-  }
-  // See graph::link_out_edges.
-  edge new_edge_out_later(node v, node w, const E& x) {
-    return linkEdgeButOut(new (edgeMemory(sizeof(detail::EdgeRecOf<E>))) detail::EdgeRecOf<E>(x), v,
-                          w);
   }
 
   const V& inf(node v) const { return payload(v); }

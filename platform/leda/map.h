@@ -11,7 +11,6 @@
 #ifndef HULCVTOOLS_PLATFORM_LEDA_MAP_H
 #define HULCVTOOLS_PLATFORM_LEDA_MAP_H
 
-#include "platform/support/KvCPrefetch.h"
 #include <cstddef>
 #include <cstdint>
 #include <deque>
@@ -120,24 +119,6 @@ public:
   }
 
   bool defined(const K& k) const { return findSlot(k, hashOf(k)) != kNoSlot; }
-
-  // Cache hints for a lookup of k to come: its home slot, then (once the slots are
-  // cached) the first entry whose hash matches. Neither reads an entry.
-  void prefetch_slot(const K& k) const {
-    if (!slots_.empty())
-      KvCPrefetch::read(&slots_[hashOf(k) & mask()]);
-  }
-  void prefetch_entry(const K& k) const {
-    if (slots_.empty())
-      return;
-    const std::size_t h = hashOf(k);
-    for (std::size_t i = h & mask(); slots_[i].entry != kNone; i = (i + 1) & mask()) {
-      if (slots_[i].hash == h) {
-        KvCPrefetch::read(&entryAt(slots_[i].entry));
-        return;
-      }
-    }
-  }
 
   // Returns false if k was not defined.
   bool undefine(const K& k) {

@@ -679,31 +679,4 @@ TEST_F(GenericCallGraphTest, CallReachedOnlyThroughAPassedFunctionStaysInTheCall
 
 namespace {
 
-TEST_F(GenericCallGraphTest, CallOperationsAddedWithSerialsAsSingleAddsWould) {
-  KvCParamSymbol* g = fn("g");
-  std::vector<KvCCallOperation*> c;
-  for (int i = 0; i < 6; ++i)
-    c.push_back(call("f", g));
-  auto serials = [](const std::vector<KvCCallOperation*>& calls) {
-    std::vector<int> result;
-    for (KvCCallOperation* op : calls)
-      result.push_back(op ? op->getSerial() : -1);
-    return result;
-  };
-  KvCFcgFunctionInfo* target = infoOf(g);
-  // Ascending after the greatest stored element: appended.
-  std::vector<KvCCallOperation*> first{c[1], c[2]};
-  target->addCallOperations(first.data(), serials(first).data(), first.size());
-  // Not ascending, below the greatest, a repeat and a null: entered one by one.
-  std::vector<KvCCallOperation*> mixed{c[5], c[0], c[2], nullptr, c[3]};
-  target->addCallOperations(mixed.data(), serials(mixed).data(), mixed.size());
-  EXPECT_EQ(callsOf(g), (std::set<KvCCallOperation*>{c[0], c[1], c[2], c[3], c[5]}));
-  std::vector<KvCCallOperation*> stored(target->getCallOperationsSet().begin(),
-                                        target->getCallOperationsSet().end());
-  EXPECT_TRUE(
-      std::is_sorted(stored.begin(), stored.end(), [](KvCCallOperation* a, KvCCallOperation* b) {
-        return a->getSerial() < b->getSerial();
-      }));
-}
-
 } // namespace
