@@ -1,5 +1,27 @@
 // The ICode model as the library's sources see it. The library includes the model only
 // through this header (and ICodeFwd.h in its own headers).
+//
+// Model operations the call graphs rely on, with the meaning a model plugged in here must
+// give them:
+// - KvCCodeViewData::getCurrent(): the code view data of the run (null before one exists);
+//   construct walks its symbol database (getSymbolDB()->forallParametrizedSymbols), which
+//   also visits symbols made during the walk.
+// - KvCSymbol::getExprLocDB()->listUses(std::vector<KV_ExprLocation*>&): the symbol's uses,
+//   all use categories, in ascending key (location serial) order, into the caller's buffer,
+//   which it clears first. Same content and order as the dictionary form; the buffer form
+//   spares a tree node per use and lets the caller reuse its memory from symbol to symbol.
+// - KV_ExprLocation::getOperation(): the operation standing at the location, or null;
+//   KV_Operation::getParentOperation(): the operation that has the operation's location as
+//   an operand, or null; KV_Operation::asCallOperation(): the call-operation view or null.
+// - KvCCallOperation::getCallingSymbol() / getCalledSymbol(): the function whose body
+//   holds the call (null outside every function) and the called function or macro;
+//   isTaskActivation(): whether the call's task-activation descriptor is present;
+//   getParent() and KV_ExprLocation::getSmbInitValExpr(): the walk up to a symbol's
+//   initial-value expression.
+// - KvCParamSymbol::getFunctionInfo(): the symbol's own function info, the same object for
+//   the symbol's whole life; KvCFcgFunctionInfo's call-operation set (addCallOperation,
+//   delCallOperation, getCallOperationsSet().clear()) and called-function set
+//   (addCalledFcn), each ignoring a repeated element.
 #ifndef HULCVTOOLS_MODELINTERFACES_ICODEMODEL_H
 #define HULCVTOOLS_MODELINTERFACES_ICODEMODEL_H
 
