@@ -4,19 +4,18 @@
 #include "platform/support/KvCMemController.h"
 
 #include <algorithm>
-#include <cstdint>
 #include <cstdlib>
 #include <new>
 #include <vector>
 
 namespace {
-// Kept a multiple of the default new alignment, so the object after it stays aligned.
-// `owner` is the controller that gave the block (0: the C heap), or the state of the pool
-// that gave it with bit 0 set.
+// Kept a multiple of the default new alignment, so the object after it stays aligned (on
+// the usual 64-bit targets that is 16 bytes, room for both pointers). The block comes from
+// the pool `pool` when that is set, otherwise from `controller` (null: the C heap).
 struct alignas(__STDCPP_DEFAULT_NEW_ALIGNMENT__) BlockHeader {
-  std::uintptr_t owner;
+  KvCMemController* controller;
+  hulcv_detail::KvCObjectPoolState* pool;
 };
-constexpr std::uintptr_t kPooled = 1;
 } // namespace
 
 namespace hulcv_detail {
@@ -85,7 +84,7 @@ struct KvCObjectPoolState {
 
 namespace {
 void releasePooled(BlockHeader* header) noexcept {
-  auto* state = reinterpret_cast<KvCObjectPoolState*>(header->owner & ~kPooled);
+  KvCObjectPoolState* state = header->pool;
   *reinterpret_cast<void**>(header) = state->freeList;
   state->freeList = header;
   if (--state->live != 0)
@@ -105,7 +104,7 @@ void* allocObject(std::size_t size) noexcept {
   void* block = controller ? controller->allocMemBlock(total) : std::malloc(total);
   if (!block)
     return nullptr;
-  auto* header = ::new (block) BlockHeader{reinterpret_cast<std::uintptr_t>(controller)};
+  auto* header = ::new (block) BlockHeader{controller, nullptr};
   return header + 1;
 }
 
@@ -113,11 +112,11 @@ void freeObject(void* object) noexcept {
   if (!object)
     return;
   BlockHeader* header = static_cast<BlockHeader*>(object) - 1;
-  if (header->owner & kPooled) {
+  if (header->pool) {
     releasePooled(header);
     return;
   }
-  auto* controller = reinterpret_cast<KvCMemController*>(header->owner);
+  KvCMemController* controller = header->controller;
   if (controller)
     controller->freeMemBlock(header);
   else
@@ -144,7 +143,7 @@ void* KvCObjectPool::allocate(std::size_t size) noexcept {
   void* block = state->take();
   if (!block)
     return nullptr;
-  auto* header = ::new (block) BlockHeader{reinterpret_cast<std::uintptr_t>(state) | kPooled};
+  auto* header = ::new (block) BlockHeader{nullptr, state};
   ++state->live;
   return header + 1;
 }
