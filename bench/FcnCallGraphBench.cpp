@@ -1,17 +1,29 @@
 // Call graph construction and recursion analysis over synthetic applications: construct
 // per call operation at 10^4..10^6 calls (10 times fewer functions) and with one scheduler
 // calling 10^4 or 10^5 functions, with warm and with evicted caches; analyzeInlining per edge with
-// 5% task calls; the transitive caller query along a long call chain.
+// 5% task calls, alone and next to Boost.Graph's strong_components on the same graph; the
+// transitive caller query along a long call chain.
+//
+// The construction figure a user meets first, one construction in a fresh process, comes
+// from FcnCallGraphConstructOnce (see compare-construct.sh); BM_Construct here measures
+// repeated constructions in one process.
 #include "HulCvTools/ExprLocDBBuilder/KvCExprLocDBBuilder.h"
 #include "HulCvTools/FcnCallGraph/KvCFcgQuery.h"
 #include "HulCvTools/FcnCallGraph/KvCFunctionCallGraph.h"
 #include "platform/builder/AppBuilder.h"
 #include "platform/builder/SyntheticApp.h"
 #include "platform/icode/KvCCodeViewData.h"
+#include "platform/icode/KvCFcgFunctionInfo.h"
 #include "platform/icode/KvCParamSymbol.h"
 
 #include <benchmark/benchmark.h>
 
+#ifdef HUL_HAVE_BOOST_GRAPH
+#include <boost/graph/adjacency_list.hpp>
+#include <boost/graph/strong_components.hpp>
+#endif
+
+#include <chrono>
 #include <map>
 #include <memory>
 #include <vector>
@@ -128,6 +140,106 @@ void BM_AnalyzeInlining(benchmark::State& state) {
   graph.shutdown();
 }
 BENCHMARK(BM_AnalyzeInlining)->Arg(100'000)->Arg(1'000'000)->Unit(benchmark::kMillisecond);
+
+#ifdef HUL_HAVE_BOOST_GRAPH
+using BoostDigraph = boost::adjacency_list<boost::vecS, boost::vecS, boost::directedS>;
+
+// The peer's whole analysis: the components, then both ends of every edge inside one
+// marked. `g` holds only the non-task edges, so no edge needs hiding.
+void boostMarkInLoop(const BoostDigraph& g, std::vector<char>& marks) {
+  std::vector<int> component(boost::num_vertices(g));
+  boost::strong_components(
+      g, boost::make_iterator_property_map(component.begin(), boost::get(boost::vertex_index, g)));
+  for (auto [e, eEnd] = boost::edges(g); e != eEnd; ++e) {
+    const auto v = boost::source(*e, g);
+    const auto w = boost::target(*e, g);
+    if (component[v] != component[w])
+      continue;
+    marks[v] = 1;
+    marks[w] = 1;
+  }
+}
+#endif
+
+// analyzeInlining and Boost.Graph's strong_components with the same marking on the same
+// graph, in turns within each iteration. The peer gets the graph's visible non-task edges
+// copied once, before the clock runs, into the adjacency list a Boost user would keep;
+// the library hides and restores the task calls itself, as its callers need. The
+// iteration time is the peer's; ns_per_edge is the peer's time per edge of the call graph
+// (all visible edges, as in BM_AnalyzeInlining), lib_ns_per_edge the library's, and
+// ratio_to_boost the library's time over the peer's. same_marks is 1 when both mark
+// exactly the same functions.
+void BM_AnalyzeInliningBoostPeer(benchmark::State& state) {
+#ifndef HUL_HAVE_BOOST_GRAPH
+  state.SkipWithError("Boost.Graph not found");
+#else
+  SyntheticAppShape shape = callsShape(state.range(0), false);
+  shape.recursionCycles = static_cast<int>(state.range(0) / 1000);
+  PreparedApp prepared = prepare(shape);
+  KvCFunctionCallGraph graph;
+  graph.boot();
+  graph.construct(false);
+
+  const auto vertices = static_cast<std::size_t>(graph.max_node_index() + 1);
+  BoostDigraph peer(vertices);
+  for (leda::edge e : graph.all_edges()) {
+    if (graph.inf(e) && graph.inf(e)->isTaskCall())
+      continue;
+    boost::add_edge(static_cast<std::size_t>(graph.index(graph.source(e))),
+                    static_cast<std::size_t>(graph.index(graph.target(e))), peer);
+  }
+
+  // Both mark the same functions: the library's marks from a clean start against the
+  // peer's, node by node (a node without info can carry no mark).
+  std::vector<char> marks(vertices, 0);
+  boostMarkInLoop(peer, marks);
+  graph.reInitInlining();
+  graph.analyzeInlining();
+  bool same = true;
+  long inLoop = 0;
+  for (leda::node v : graph.all_nodes()) {
+    const KvCFcgFunctionInfo* info = graph.inf(v);
+    if (!info)
+      continue;
+    const bool peerMark = marks[static_cast<std::size_t>(graph.index(v))] != 0;
+    same = same && info->isInLoop() == peerMark;
+    inLoop += peerMark ? 1 : 0;
+  }
+
+  using Clock = std::chrono::steady_clock;
+  double libSeconds = 0;
+  double peerSeconds = 0;
+  for (auto _ : state) {
+    const auto t0 = Clock::now();
+    graph.analyzeInlining();
+    const auto t1 = Clock::now();
+    boostMarkInLoop(peer, marks);
+    const auto t2 = Clock::now();
+    benchmark::DoNotOptimize(marks.data());
+    const double lib = std::chrono::duration<double>(t1 - t0).count();
+    const double boostTime = std::chrono::duration<double>(t2 - t1).count();
+    libSeconds += lib;
+    peerSeconds += boostTime;
+    state.SetIterationTime(boostTime);
+  }
+
+  const double edges = graph.number_of_edges();
+  const double iterations = static_cast<double>(state.iterations());
+  state.counters["edges"] = edges;
+  state.counters["boost_edges"] = static_cast<double>(boost::num_edges(peer));
+  state.counters["in_loop"] = static_cast<double>(inLoop);
+  state.counters["ns_per_edge"] = peerSeconds * 1e9 / (iterations * edges);
+  state.counters["lib_ns_per_edge"] = libSeconds * 1e9 / (iterations * edges);
+  state.counters["ratio_to_boost"] = peerSeconds > 0 ? libSeconds / peerSeconds : 0.0;
+  state.counters["same_marks"] = same ? 1 : 0;
+  graph.shutdown();
+#endif
+}
+BENCHMARK(BM_AnalyzeInliningBoostPeer)
+    ->Arg(100'000)
+    ->Arg(1'000'000)
+    ->UseManualTime()
+    ->Unit(benchmark::kMillisecond);
 
 // A chain f0 -> f1 -> ... -> f(n-1): analyzeInlining without recursion, and the callers of
 // a function at depth k (k callers reached).
