@@ -2,6 +2,7 @@
 
 #include "HulCvTools/Control/KvCInternalCheck.h"
 #include "HulCvTools/Control/KvCObjectPool.h"
+#include "HulCvTools/FcnCallGraph/KvCFcgCallReader.h"
 #include "HulCvTools/FcnCallGraph/KvCFcnSmbVisitor.h"
 #include "HulCvTools/ModelInterfaces/ICodeModel.h"
 
@@ -10,7 +11,8 @@
 template class leda::GRAPH<KvCFcgFunctionInfo*, KvCFcgEdgeInfo*>;
 
 KvCGenericFunctionCallGraph::KvCGenericFunctionCallGraph()
-    : edgeInfoPool(std::make_unique<KvCObjectPool>(sizeof(KvCFcgEdgeInfo))) {}
+    : edgeInfoPool(std::make_unique<KvCObjectPool>(sizeof(KvCFcgEdgeInfo))),
+      callReader(std::make_unique<KvCFcgCallReader>()) {}
 
 KvCGenericFunctionCallGraph::~KvCGenericFunctionCallGraph() {
   // Every info goes while the pool is still there; the graph's own destructor then finds
@@ -21,47 +23,42 @@ KvCGenericFunctionCallGraph::~KvCGenericFunctionCallGraph() {
 // --- construction
 
 bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
+  if (!KV_VERIFY(!constructing, "KvCGenericFunctionCallGraph", __LINE__))
+    return false;
   KvCFcnSmbVisitor visitor(this, !onlySelected);
   incomplete = false;
   restore_all_edges();
   deleteAllEdges();
   deleteAllNodes();
   KvCCodeViewData* data = KvCCodeViewData::getCurrent();
-  if (!KV_VERIFY(data != nullptr && data->getSymbolDB() != nullptr,
-                 "KvCGenericFunctionCallGraph", __LINE__)) {
+  KV_SymbolDB* symbols = data ? data->getSymbolDB() : nullptr;
+  if (!KV_VERIFY(symbols != nullptr, "KvCGenericFunctionCallGraph", __LINE__)) {
     incomplete = true;
     return false;
   }
-  data->getSymbolDB()->forallParametrizedSymbols(&visitor);
+  constructing = true;
+  callReader->readAhead(symbols, !onlySelected);
+  symbols->forallParametrizedSymbols(&visitor);
+  callReader->clear();
+  constructing = false;
   return !incomplete;
 }
 
 void KvCGenericFunctionCallGraph::treatFcnSymbolByUses(KvCParamSymbol* function) {
-  // The uses in ascending key order, into the buffer kept from symbol to symbol. It is
-  // taken out of the member while the calls are entered, so a hook that constructs this
-  // graph again cannot pull it away under the loop.
-  std::vector<KV_ExprLocation*> list;
-  list.swap(uses);
-  function->getExprLocDB()->listUses(list);
+  // The calls above the uses, in ascending key order of the uses (read ahead by construct,
+  // or now when the symbol was not listed ahead).
+  const auto [first, last] = callReader->callsOf(function);
   KvCFcgFunctionInfo* info = provideFcgNodeInfo(function);
-  if (info) {
-    registerNode(info);
-    synchronizeNodeInfoAtConstruction(info, function);
-    for (KV_ExprLocation* use : list)
-      enterCallAbove(use);
-  }
-  list.swap(uses);
-}
-
-void KvCGenericFunctionCallGraph::enterCallAbove(KV_ExprLocation* use) {
-  KV_Operation* op = use->getOperation();
-  if (!op) {
-    incomplete = true;
+  if (!info)
     return;
+  registerNode(info);
+  synchronizeNodeInfoAtConstruction(info, function);
+  for (const KvCFcgCallReader::UseCall* use = first; use != last; ++use) {
+    if (!use->hasOperation)
+      incomplete = true;
+    else if (use->call)
+      enterCall(use->call, use->calling, use->called);
   }
-  KV_Operation* above = op->getParentOperation();
-  if (KvCCallOperation* call = above ? above->asCallOperation() : nullptr)
-    addCall(call);
 }
 
 // --- single calls
@@ -81,8 +78,11 @@ bool KvCGenericFunctionCallGraph::isInInitialValue(KvCCallOperation* call) {
 bool KvCGenericFunctionCallGraph::addCall(KvCCallOperation* call) {
   if (!call)
     return false;
-  KvCParamSymbol* calling = call->getCallingSymbol();
-  KvCParamSymbol* called = call->getCalledSymbol();
+  return enterCall(call, call->getCallingSymbol(), call->getCalledSymbol());
+}
+
+bool KvCGenericFunctionCallGraph::enterCall(KvCCallOperation* call, KvCParamSymbol* calling,
+                                            KvCParamSymbol* called) {
   if (!calling || !called) {
     // A call of an access function or RTE API macro in a symbol's initial value lies
     // outside every function by design; anything else without both ends is a fault, and
@@ -139,17 +139,19 @@ bool KvCGenericFunctionCallGraph::addEdge(KvCFcgFunctionInfo* calling, KvCFcgFun
     return false;
   const leda::node v = nodeOf(calling);
   const leda::node w = nodeOf(called);
-  if (leda::edge existing = findEdge(v, w)) {
-    // An edge made through the inherited graph operations may come without info.
-    if (!inf(existing))
-      assign(existing, createFcgEdgeInfo());
-    if (!inf(existing))
-      return false;
-    inf(existing)->incCardinality();
-    e = existing;
-    return false;
+  leda::edge existing = findEdge(v, w);
+  if (!existing) {
+    e = linkNewEdge(v, w);
+    return e != nullptr;
   }
-  return addNewEdge(calling, called, e);
+  // An edge made through the inherited graph operations may come without info.
+  if (!inf(existing))
+    assign(existing, createFcgEdgeInfo());
+  if (!inf(existing))
+    return false;
+  inf(existing)->incCardinality();
+  e = existing;
+  return false;
 }
 
 bool KvCGenericFunctionCallGraph::addNewEdge(KvCFcgFunctionInfo* calling,
@@ -157,14 +159,18 @@ bool KvCGenericFunctionCallGraph::addNewEdge(KvCFcgFunctionInfo* calling,
   e = nullptr;
   if (!calling || !called)
     return false;
-  KvCFcgEdgeInfo* info = createFcgEdgeInfo();
-  if (!info)
-    return false;
-  info->incCardinality();
   const leda::node v = nodeOf(calling);
   const leda::node w = nodeOf(called);
-  e = new_edge(v, w, info);
-  return true;
+  e = linkNewEdge(v, w);
+  return e != nullptr;
+}
+
+leda::edge KvCGenericFunctionCallGraph::linkNewEdge(leda::node v, leda::node w) {
+  KvCFcgEdgeInfo* info = createFcgEdgeInfo();
+  if (!info)
+    return nullptr;
+  info->incCardinality();
+  return new_edge(v, w, info);
 }
 
 leda::node KvCGenericFunctionCallGraph::nodeOf(KvCFcgFunctionInfo* function) {

@@ -34,11 +34,15 @@
 // one, in ascending key order, exactly as addCall enters them (provideFcgNodeInfo for
 // both ends, createFcgEdgeInfo for a new edge, synchronizeEdgeInfoAtConstruction). The same
 // order holds for every graph type. Hooks may read the graph; deleteFcgEdgeInfo, which may
-// be called from inside a graph operation, must not change it.
+// be called from inside a graph operation, must not change it. Construction reads the
+// calls above all uses from the ICode before it enters them (in the ICode's key order,
+// which spares a jump through the ICode per use), so hooks must not add or remove call
+// operations while it runs, nor construct this graph again.
 //
-// Cost: construct is O(symbols + uses * (1 + edge scan)) expected; addCall and delCall
-// O(1) expected plus the edge scan. Memory: the graph's node and edge records, one pooled
-// edge info per edge and one node-map entry per function.
+// Cost: construct is O(symbols + uses * (1 + edge scan)) expected, with about 60 bytes
+// per use of scratch while it runs; addCall and delCall O(1) expected plus the edge scan.
+// Memory: the graph's node and edge records, one pooled edge info per edge and one
+// node-map entry per function.
 #ifndef HULCVTOOLS_FCNCALLGRAPH_KVCGENERICFUNCTIONCALLGRAPH_H
 #define HULCVTOOLS_FCNCALLGRAPH_KVCGENERICFUNCTIONCALLGRAPH_H
 
@@ -55,6 +59,7 @@
 #include <memory>
 #include <vector>
 
+class KvCFcgCallReader;
 class KvCFcnSmbVisitor;
 class KvCObjectPool;
 
@@ -157,11 +162,13 @@ private:
   friend class KvCFcnSmbVisitor;
 
   void treatFcnSymbolByUses(KvCParamSymbol* function);
-  // Enters the call operation above `use`, if any; a use without operation makes the
-  // construction incomplete.
-  void enterCallAbove(KV_ExprLocation* use);
+  // addCall with the call's ends given (as construction read them ahead).
+  bool enterCall(KvCCallOperation* call, KvCParamSymbol* calling, KvCParamSymbol* called);
   // The function's node, registered when missing.
   leda::node nodeOf(KvCFcgFunctionInfo* function);
+  // A new edge v -> w with a new edge info of cardinality 1, or null when no info could
+  // be made.
+  leda::edge linkNewEdge(leda::node v, leda::node w);
   // The first visible edge v -> w, or null.
   leda::edge findEdge(leda::node v, leda::node w) const;
   // Passes e's info to deleteFcgEdgeInfo and detaches it from e.
@@ -175,8 +182,9 @@ private:
   bool incomplete = true;
   // Storage of the edge infos the base hook makes.
   std::unique_ptr<KvCObjectPool> edgeInfoPool;
-  // The uses of the symbol being treated; kept from symbol to symbol to spare allocations.
-  std::vector<KV_ExprLocation*> uses;
+  // While construct runs: the calls above the uses, read ahead (see KvCFcgCallReader).
+  std::unique_ptr<KvCFcgCallReader> callReader;
+  bool constructing = false;
 };
 
 #endif

@@ -6,10 +6,10 @@
 // - KvCCodeViewData::getCurrent(): the code view data of the run (null before one exists);
 //   construct walks its symbol database (getSymbolDB()->forallParametrizedSymbols), which
 //   also visits symbols made during the walk.
-// - KvCSymbol::getExprLocDB()->listUses(std::vector<KV_ExprLocation*>&): the symbol's uses,
-//   all use categories, in ascending key (location serial) order, into the caller's buffer,
-//   which it clears first. Same content and order as the dictionary form; the buffer form
-//   spares a tree node per use and lets the caller reuse its memory from symbol to symbol.
+// - KvCSymbol::getExprLocDB()->listUses(std::vector<KvCExprLocDB::KeyedLocation>&): the
+//   symbol's uses with their integer keys, all use categories, in ascending key order, into
+//   the caller's buffer, which it clears first: the items of the dictionary form, without
+//   a tree node per use. Keys are comparable across databases (the ICode's creation order).
 // - KV_ExprLocation::getOperation(): the operation standing at the location, or null;
 //   KV_Operation::getParentOperation(): the operation that has the operation's location as
 //   an operand, or null; KV_Operation::asCallOperation(): the call-operation view or null.

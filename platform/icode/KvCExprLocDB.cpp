@@ -26,6 +26,7 @@ bool KvCExprLocDB::add(tagKvEExprLocDBCategory category, KV_ExprLocation* loc) {
   std::vector<KV_ExprLocation*>& list = entries[category];
   slot = KV_ExprLocation::DbSlot{this, category, static_cast<int>(list.size())};
   list.push_back(loc);
+  serials[category].push_back(loc->getSerial());
   if (loc->getSerial() <= lastSerial[category])
     unsorted |= 1U << category;
   lastSerial[category] = loc->getSerial();
@@ -42,9 +43,13 @@ bool KvCExprLocDB::removeSide(bool defSide, KV_ExprLocation* loc) {
   KV_ExprLocation* last = list.back();
   if (last != loc)
     unsorted |= 1U << slot.category; // the last entry moves into the gap
-  list[static_cast<std::size_t>(slot.position)] = last;
+  const auto at = static_cast<std::size_t>(slot.position);
+  list[at] = last;
+  std::vector<int>& keys = serials[slot.category];
+  keys[at] = keys.back();
   (defSide ? last->defSlot : last->useSlot).position = slot.position;
   list.pop_back();
+  keys.pop_back();
   slot = KV_ExprLocation::DbSlot{};
   return true;
 }
@@ -69,22 +74,24 @@ void KvCExprLocDB::listUses(leda::dictionary<int, KV_ExprLocation*>& uses) const
   listRange(KV_DB_USE, KV_DB_QSO_USE, uses);
 }
 
-void KvCExprLocDB::listUses(std::vector<KV_ExprLocation*>& uses) const {
+void KvCExprLocDB::listUses(std::vector<KeyedLocation>& uses) const {
   uses.clear();
   int filled = 0;
   bool sorted = true;
   for (int c = KV_DB_USE; c <= KV_DB_QSO_USE; ++c) {
-    if (entries[c].empty())
+    const std::size_t n = entries[c].size();
+    if (n == 0)
       continue;
-    uses.insert(uses.end(), entries[c].begin(), entries[c].end());
+    for (std::size_t i = 0; i < n; ++i)
+      uses.emplace_back(serials[c][i], entries[c][i]);
     ++filled;
     sorted = sorted && !(unsorted & (1U << c));
   }
-  // One category in serial order is the answer as it stands (no location is read).
+  // One category in serial order is the answer as it stands.
   if (filled <= 1 && sorted)
     return;
-  std::sort(uses.begin(), uses.end(), [](const KV_ExprLocation* a, const KV_ExprLocation* b) {
-    return a->getSerial() < b->getSerial();
+  std::sort(uses.begin(), uses.end(), [](const KeyedLocation& a, const KeyedLocation& b) {
+    return a.first < b.first;
   });
 }
 
@@ -130,6 +137,7 @@ void KvCExprLocDB::clear() {
     for (KV_ExprLocation* loc : entries[c])
       (defSide ? loc->defSlot : loc->useSlot) = KV_ExprLocation::DbSlot{};
     entries[c].clear();
+    serials[c].clear();
     lastSerial[c] = -1;
   }
   unsorted = 0;

@@ -19,6 +19,7 @@
 #include "platform/leda/dictionary.h"
 #include "platform/support/HulPlatformExport.h"
 
+#include <utility>
 #include <vector>
 
 class KV_ExprLocation;
@@ -58,10 +59,13 @@ public:
   // cleared first.
   void listDefs(leda::dictionary<int, KV_ExprLocation*>& defs) const;
   void listUses(leda::dictionary<int, KV_ExprLocation*>& uses) const;
-  // The uses in ascending serial order, into a vector the caller may reuse (cleared first).
-  // O(number of uses) when the uses were entered in ascending serial order (as a walk of the
-  // ICode enters them) and none was removed from the middle since; O(n log n) otherwise.
-  void listUses(std::vector<KV_ExprLocation*>& uses) const;
+  // The uses with their keys (serial numbers), as the dictionary form lists them, in
+  // ascending key order into a vector the caller may reuse (cleared first). Reads no
+  // location. O(number of uses) when the uses were entered in ascending serial order (as a
+  // walk of the ICode enters them) and none was removed from the middle since; O(n log n)
+  // otherwise.
+  using KeyedLocation = std::pair<int, KV_ExprLocation*>;
+  void listUses(std::vector<KeyedLocation>& uses) const;
   void listCategory(tagKvEExprLocDBCategory category,
                     leda::dictionary<int, KV_ExprLocation*>& entries) const;
 
@@ -78,6 +82,8 @@ private:
   void listRange(int first, int last, leda::dictionary<int, KV_ExprLocation*>& out) const;
 
   std::vector<KV_ExprLocation*> entries[KV_DB_NUMBER_OF_CATEGORIES];
+  // The serial number of each entry, kept in step with `entries`.
+  std::vector<int> serials[KV_DB_NUMBER_OF_CATEGORIES];
   // Per category: the serial number of the last entry added, and (one bit each) whether
   // the entries may be out of ascending serial order.
   int lastSerial[KV_DB_NUMBER_OF_CATEGORIES];

@@ -266,9 +266,14 @@ TEST(ExprLocDBTest, RandomSequenceAgreesWithReference) {
     // Compare every category of every database with the reference, and the fast listing
     // of the uses with the keyed one.
     for (int dd = 0; dd < 3; ++dd) {
-      std::vector<KV_ExprLocation*> fast;
+      std::vector<KvCExprLocDB::KeyedLocation> fast;
       dbs[static_cast<std::size_t>(dd)]->listUses(fast);
-      ASSERT_EQ(fast, uses(*dbs[static_cast<std::size_t>(dd)])) << "step " << stepNo;
+      Listing keyed;
+      dbs[static_cast<std::size_t>(dd)]->listUses(keyed);
+      std::vector<KvCExprLocDB::KeyedLocation> want;
+      for (const auto& item : keyed)
+        want.emplace_back(item.first, item.second);
+      ASSERT_EQ(fast, want) << "step " << stepNo;
       for (tagKvEExprLocDBCategory c : kAllCategories) {
         std::vector<KV_ExprLocation*> want;
         for (const auto& [key, place] : where)
