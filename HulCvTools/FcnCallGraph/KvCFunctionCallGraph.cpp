@@ -4,6 +4,8 @@
 #include "HulCvTools/ModelInterfaces/ICodeModel.h"
 #include "platform/leda/strong_components.h"
 
+#include <vector>
+
 HULCV_DEFINE_HEAP_OPERATORS(KvCFunctionCallGraph)
 
 KvCFunctionCallGraph::~KvCFunctionCallGraph() = default;
@@ -22,20 +24,31 @@ void KvCFunctionCallGraph::synchronizeNodeInfoAtConstruction(KvCFcgFunctionInfo*
 }
 
 bool KvCFunctionCallGraph::analyzeInlining() {
-  leda::node_array<int> component(*this, 0);
-  for (leda::edge e : all_edges())
-    if (inf(e) && inf(e)->isTaskCall())
+  // Task calls never close a cycle: hide them. A visible self-loop puts its function on a
+  // cycle whatever the components say, so those are noted on the way.
+  std::vector<leda::node> selfCalling;
+  for (leda::edge e : all_edges()) {
+    const KvCFcgEdgeInfo* info = inf(e);
+    if (info && info->isTaskCall())
       hide_edge(e);
+    else if (source(e) == target(e))
+      selfCalling.push_back(source(e));
+  }
+  leda::node_array<int> component(*this, 0);
   const int count = leda::STRONG_COMPONENTS(*this, component);
   if (count > 0) {
-    for (leda::edge e : all_edges()) {
-      if (component[source(e)] != component[target(e)])
-        continue;
-      if (KvCFcgFunctionInfo* from = inf(source(e)))
-        from->markInLoop();
-      if (KvCFcgFunctionInfo* to = inf(target(e)))
-        to->markInLoop();
-    }
+    // A visible edge joins two nodes of one component exactly when the component has two
+    // or more nodes (each of them has an edge inside it) or the edge is a self-loop, so
+    // marking both ends of every such edge marks these nodes.
+    std::vector<int> members(static_cast<std::size_t>(count), 0);
+    for (leda::node v : all_nodes())
+      ++members[static_cast<std::size_t>(component[v])];
+    for (leda::node v : all_nodes())
+      if (members[static_cast<std::size_t>(component[v])] > 1 && inf(v))
+        inf(v)->markInLoop();
+    for (leda::node v : selfCalling)
+      if (inf(v))
+        inf(v)->markInLoop();
   }
   restore_all_edges();
   return true;

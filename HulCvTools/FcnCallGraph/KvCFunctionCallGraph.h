@@ -20,8 +20,10 @@ public:
   bool construct(bool onlySelected) override;
   leda::map<KvCFcgFunctionInfo*, leda::node>& getGraphMap() { return nodeMap(); }
   // Marks every function on a cycle of calls that are not task calls: hides the task-call
-  // edges, computes the strongly connected components, marks both ends of every edge
-  // inside a component, restores the edges. Only sets marks. O(nodes + edges). True.
+  // edges, computes the strongly connected components, marks the members of every
+  // component of two or more functions and every function with a visible self-call (the
+  // ends of the edges inside components), then restores all hidden edges, including any
+  // a caller hid before. Only sets marks. O(nodes + edges). True.
   bool analyzeInlining();
   // Clears every function's in-loop mark. True.
   bool reInitInlining();

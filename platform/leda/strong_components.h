@@ -16,6 +16,7 @@
 
 #include <algorithm>
 #include <cstddef>
+#include <utility>
 #include <vector>
 
 namespace leda {
@@ -31,14 +32,19 @@ public:
       : G_(G), bound_(static_cast<std::size_t>(G.max_node_index() + 1)), order_(bound_, -1),
         low_(bound_, 0), onStack_(bound_, 0), cursor_(bound_, 0), comp_(bound_, -1),
         firstOut_(bound_ + 1, 0) {
-    for (edge e : G_.all_edges())
+    // One walk over the edge records; the sort then runs over the compact pairs.
+    std::vector<std::pair<int, int>> pairs;
+    pairs.reserve(static_cast<std::size_t>(G_.number_of_edges()));
+    for (edge e : G_.all_edges()) {
+      pairs.emplace_back(e->src->id, e->tgt->id);
       ++firstOut_[slot(e->src) + 1];
+    }
     for (std::size_t i = 0; i < bound_; ++i)
       firstOut_[i + 1] += firstOut_[i];
     targets_.resize(firstOut_[bound_]);
     std::vector<std::size_t> fill(firstOut_.begin(), firstOut_.end() - 1);
-    for (edge e : G_.all_edges())
-      targets_[fill[slot(e->src)]++] = e->tgt->id;
+    for (const auto& [source, target] : pairs)
+      targets_[fill[at(source)]++] = target;
   }
 
   int run(node_array<int>& compnum) {
