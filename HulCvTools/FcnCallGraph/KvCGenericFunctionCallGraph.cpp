@@ -194,8 +194,11 @@ bool KvCGenericFunctionCallGraph::getNode(KvCFcgFunctionInfo* function, leda::no
 
 leda::edge KvCGenericFunctionCallGraph::findEdge(leda::node v, leda::node w) const {
   // Out-edges and in-edges are both kept in creation order, so either list meets the
-  // pair's edges in the same order.
-  if (outdeg(v) <= indeg(w)) {
+  // pair's edges in the same order. The called node's in-edges are scanned unless they are
+  // more than a few times as many as the caller's out-edges: while construction enters the
+  // calls of one function, its in-edges were made just before and are at hand, whereas the
+  // caller's out-edges lie scattered. Either way the scan is O(min(out-degree, in-degree)).
+  if (indeg(w) > 4 * outdeg(v) + 4) {
     for (leda::edge e : out_edges(v))
       if (target(e) == w)
         return e;

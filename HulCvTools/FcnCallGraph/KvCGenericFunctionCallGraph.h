@@ -23,10 +23,10 @@
 // beside the graph except the node map, which the graph's update handlers keep in step when
 // nodes go (del_node, clear):
 // - getNode: one hashed lookup in the node map.
-// - getEdge: scans the shorter of the calling node's out-edges and the called node's
-//   in-edges (both in creation order, hidden edges skipped), so it costs
-//   O(min(out-degree, in-degree)): a scheduler calling thousands of functions each once
-//   finds every edge at the called function's single in-edge.
+// - getEdge: scans the called node's in-edges, or the calling node's out-edges when those
+//   are less than a quarter as many (both in creation order, hidden edges skipped), so it
+//   costs O(min(out-degree, in-degree)): a scheduler calling thousands of functions each
+//   once finds every edge at the called function's single in-edge.
 //
 // Hooks: construct visits the function and macro symbols in the symbol database's order;
 // for each it calls provideFcgNodeInfo, registers the node and calls
