@@ -19,8 +19,7 @@ namespace {
 // Collects the function and macro symbols a construction run treats, in database order.
 class KvCFcgSymbolLister : public KV_SmbDBObjVisitor {
 public:
-  KvCFcgSymbolLister(std::vector<KvCParamSymbol*>& out, bool all)
-      : symbols(out), visitAll(all) {}
+  KvCFcgSymbolLister(std::vector<KvCParamSymbol*>& out, bool all) : symbols(out), visitAll(all) {}
   void visitParamSmbDBObj(KV_ParamSmbDBObj* entry) override {
     if (!kvFcgVisitsEntry(entry, visitAll))
       return;

@@ -59,11 +59,11 @@ private:
   // nearby keys (one counting pass). O(n + buckets).
   static void orderByKey(const std::vector<int>& keys, std::vector<std::uint32_t>& order);
 
-  std::vector<KvCParamSymbol*> symbols;  // listed, in visiting order
-  std::vector<std::uint32_t> firstUse;   // per listed symbol, and one past the last
-  std::vector<UseCall> calls;            // per listed use, grouped by symbol
-  std::size_t nextSymbol = 0;            // the next listed symbol callsOf expects
-  std::vector<UseCall> late;             // the calls of a symbol read when asked for
+  std::vector<KvCParamSymbol*> symbols; // listed, in visiting order
+  std::vector<std::uint32_t> firstUse;  // per listed symbol, and one past the last
+  std::vector<UseCall> calls;           // per listed use, grouped by symbol
+  std::size_t nextSymbol = 0;           // the next listed symbol callsOf expects
+  std::vector<UseCall> late;            // the calls of a symbol read when asked for
 };
 
 #endif

@@ -90,9 +90,8 @@ void KvCExprLocDB::listUses(std::vector<KeyedLocation>& uses) const {
   // One category in serial order is the answer as it stands.
   if (filled <= 1 && sorted)
     return;
-  std::sort(uses.begin(), uses.end(), [](const KeyedLocation& a, const KeyedLocation& b) {
-    return a.first < b.first;
-  });
+  std::sort(uses.begin(), uses.end(),
+            [](const KeyedLocation& a, const KeyedLocation& b) { return a.first < b.first; });
 }
 
 void KvCExprLocDB::listCategory(tagKvEExprLocDBCategory category,

@@ -677,6 +677,4 @@ TEST_F(GenericCallGraphTest, CallReachedOnlyThroughAPassedFunctionStaysInTheCall
 
 } // namespace
 
-namespace {
-
-} // namespace
+namespace {} // namespace
