@@ -43,6 +43,27 @@ void writeDot(const KvCFunctionCallGraph& graph, const char* path, std::ostream&
   out << "  call graph written to " << path << "\n";
 }
 
+// A pass may edit the graph through the graph operations it inherits; the call graph's
+// lookups follow, and the deleted edge's info is released with it.
+void showEditThroughTheGraph(KvCFunctionCallGraph& graph, std::ostream& out) {
+  leda::edge e = graph.first_edge();
+  if (!e)
+    return;
+  KvCFcgFunctionInfo* calling = graph.inf(graph.source(e));
+  KvCFcgFunctionInfo* called = graph.inf(graph.target(e));
+  const std::string pair = nameOf(graph, graph.source(e)) + " -> " + nameOf(graph, graph.target(e));
+  graph.del_edge(e);
+  leda::edge found = nullptr;
+  out << "  a pass deletes " << pair << " through the graph itself: getEdge "
+      << (graph.getEdge(calling, called, found) ? "still finds it" : "finds none");
+  graph.construct(false);
+  out << "; after construct again: "
+      << (graph.getEdge(calling, called, found)
+              ? pair + " x" + std::to_string(graph.inf(found)->getCardinality())
+              : std::string("none"))
+      << "\n";
+}
+
 } // namespace
 
 void demoCallGraph(DemoRun& run) {
@@ -77,6 +98,7 @@ void demoCallGraph(DemoRun& run) {
   run.out << "\n";
   if (run.dotFile)
     writeDot(graph, run.dotFile, run.out);
+  showEditThroughTheGraph(graph, run.out);
   graph.reInitInlining();
   graph.shutdown();
 }
