@@ -402,28 +402,6 @@ TEST_F(GenericCallGraphTest, RandomUpdatesAgreeWithReference) {
 
 } // namespace
 
-namespace {
-
-TEST_F(GenericCallGraphTest, PairWithTwoEdgesAfterHidingKeepsBothFindable) {
-  KvCCallOperation* first = call("f", fn("g"));
-  KvCCallOperation* second = call("f", fn("g"));
-  addAll({first});
-  leda::edge e = nullptr;
-  ASSERT_TRUE(graph.getEdge(info("f"), info("g"), e));
-  graph.hide_edge(e);
-  addAll({second});
-  graph.restore_all_edges();
-  ASSERT_EQ(graph.number_of_edges(), 2);
-  leda::edge found = nullptr;
-  ASSERT_TRUE(graph.getEdge(info("f"), info("g"), found));
-  EXPECT_EQ(found, e) << "the first edge in creation order, as a scan finds it";
-  EXPECT_TRUE(graph.delCall(first));
-  EXPECT_TRUE(graph.delCall(second));
-  EXPECT_EQ(graph.number_of_edges(), 0);
-}
-
-} // namespace
-
 // --- construct against entering every use one at a time
 
 namespace {
