@@ -23,10 +23,9 @@ bool KvCExprLocDB::add(tagKvEExprLocDBCategory category, KV_ExprLocation* loc) {
     return true;
   if (slot.db)
     slot.db->removeSide(defSide, loc);
-  std::vector<KV_ExprLocation*>& list = entries[category];
+  std::vector<KeyedLocation>& list = entries[category];
   slot = KV_ExprLocation::DbSlot{this, category, static_cast<int>(list.size())};
-  list.push_back(loc);
-  serials[category].push_back(loc->getSerial());
+  list.emplace_back(loc->getSerial(), loc);
   if (loc->getSerial() <= lastSerial[category])
     unsorted |= 1U << category;
   lastSerial[category] = loc->getSerial();
@@ -39,17 +38,13 @@ bool KvCExprLocDB::removeSide(bool defSide, KV_ExprLocation* loc) {
   KV_ExprLocation::DbSlot& slot = defSide ? loc->defSlot : loc->useSlot;
   if (slot.db != this)
     return false;
-  std::vector<KV_ExprLocation*>& list = entries[slot.category];
-  KV_ExprLocation* last = list.back();
+  std::vector<KeyedLocation>& list = entries[slot.category];
+  KV_ExprLocation* last = list.back().second;
   if (last != loc)
     unsorted |= 1U << slot.category; // the last entry moves into the gap
-  const auto at = static_cast<std::size_t>(slot.position);
-  list[at] = last;
-  std::vector<int>& keys = serials[slot.category];
-  keys[at] = keys.back();
+  list[static_cast<std::size_t>(slot.position)] = list.back();
   (defSide ? last->defSlot : last->useSlot).position = slot.position;
   list.pop_back();
-  keys.pop_back();
   slot = KV_ExprLocation::DbSlot{};
   return true;
 }
@@ -62,8 +57,8 @@ void KvCExprLocDB::listRange(int first, int last,
                              leda::dictionary<int, KV_ExprLocation*>& out) const {
   out.clear();
   for (int c = first; c <= last; ++c)
-    for (KV_ExprLocation* loc : entries[c])
-      out.insert(loc->getSerial(), loc);
+    for (const auto& [key, loc] : entries[c])
+      out.insert(key, loc);
 }
 
 void KvCExprLocDB::listDefs(leda::dictionary<int, KV_ExprLocation*>& defs) const {
@@ -79,11 +74,9 @@ void KvCExprLocDB::listUses(std::vector<KeyedLocation>& uses) const {
   int filled = 0;
   bool sorted = true;
   for (int c = KV_DB_USE; c <= KV_DB_QSO_USE; ++c) {
-    const std::size_t n = entries[c].size();
-    if (n == 0)
+    if (entries[c].empty())
       continue;
-    for (std::size_t i = 0; i < n; ++i)
-      uses.emplace_back(serials[c][i], entries[c][i]);
+    uses.insert(uses.end(), entries[c].begin(), entries[c].end());
     ++filled;
     sorted = sorted && !(unsorted & (1U << c));
   }
@@ -133,10 +126,9 @@ bool KvCExprLocDB::contains(tagKvEExprLocDBCategory category, const KV_ExprLocat
 void KvCExprLocDB::clear() {
   for (int c = 0; c < KV_DB_NUMBER_OF_CATEGORIES; ++c) {
     const bool defSide = isDefCategory(static_cast<tagKvEExprLocDBCategory>(c));
-    for (KV_ExprLocation* loc : entries[c])
-      (defSide ? loc->defSlot : loc->useSlot) = KV_ExprLocation::DbSlot{};
+    for (const auto& entry : entries[c])
+      (defSide ? entry.second->defSlot : entry.second->useSlot) = KV_ExprLocation::DbSlot{};
     entries[c].clear();
-    serials[c].clear();
     lastSerial[c] = -1;
   }
   unsorted = 0;

@@ -81,9 +81,8 @@ private:
   bool removeSide(bool defSide, KV_ExprLocation* loc);
   void listRange(int first, int last, leda::dictionary<int, KV_ExprLocation*>& out) const;
 
-  std::vector<KV_ExprLocation*> entries[KV_DB_NUMBER_OF_CATEGORIES];
-  // The serial number of each entry, kept in step with `entries`.
-  std::vector<int> serials[KV_DB_NUMBER_OF_CATEGORIES];
+  // Per category, each entry with its key (serial number).
+  std::vector<KeyedLocation> entries[KV_DB_NUMBER_OF_CATEGORIES];
   // Per category: the serial number of the last entry added, and (one bit each) whether
   // the entries may be out of ascending serial order.
   int lastSerial[KV_DB_NUMBER_OF_CATEGORIES];
