@@ -23,7 +23,8 @@ KvCGenericFunctionCallGraph::~KvCGenericFunctionCallGraph() {
 // --- construction
 
 bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
-  if (!KV_VERIFY(!constructing, "KvCGenericFunctionCallGraph", __LINE__))
+  // A hook that starts this graph's construction again would pull the run's reads away.
+  if (!KV_VERIFY(!constructing, "KvCGenericFunctionCallGraph", 111))
     return false;
   KvCFcnSmbVisitor visitor(this, !onlySelected);
   incomplete = false;
@@ -32,7 +33,7 @@ bool KvCGenericFunctionCallGraph::construct(bool onlySelected) {
   deleteAllNodes();
   KvCCodeViewData* data = KvCCodeViewData::getCurrent();
   KV_SymbolDB* symbols = data ? data->getSymbolDB() : nullptr;
-  if (!KV_VERIFY(symbols != nullptr, "KvCGenericFunctionCallGraph", __LINE__)) {
+  if (!KV_VERIFY(symbols != nullptr, "KvCGenericFunctionCallGraph", 110)) {
     incomplete = true;
     return false;
   }

@@ -656,3 +656,44 @@ TEST_F(GenericCallGraphTest, CallReachedOnlyThroughAPassedFunctionStaysInTheCall
 } // namespace
 
 namespace {} // namespace
+
+namespace {
+
+// A hook that starts the same graph's construction again, and makes a function symbol,
+// while the first run is under way.
+class ReenteringGraph : public KvCGenericFunctionCallGraph {
+public:
+  explicit ReenteringGraph(AppBuilder& builder) : app(builder) {}
+  bool nestedResult = true;
+
+protected:
+  void synchronizeNodeInfoAtConstruction(KvCFcgFunctionInfo* /*info*/,
+                                         KvCParamSymbol* /*function*/) override {
+    if (done)
+      return;
+    done = true;
+    nestedResult = construct(false);
+    app.function("late");
+  }
+
+private:
+  AppBuilder& app;
+  bool done = false;
+};
+
+TEST_F(GenericCallGraphTest, ConstructStartedFromAHookIsRefusedAndLateSymbolsAreVisited) {
+  call("f", fn("g"));
+  call("f", fn("g"));
+  call("g", fn("f"));
+  buildDatabases();
+  ReenteringGraph reentering(app);
+  EXPECT_TRUE(reentering.construct(false));
+  EXPECT_FALSE(reentering.nestedResult);
+  EXPECT_EQ(messageNumbers(), std::vector<int>{10007});
+  ASSERT_TRUE(graph.construct(false));
+  EXPECT_EQ(edgesOf(reentering), edgesOf(graph)) << "the outer run went on undisturbed";
+  leda::node late = nullptr;
+  EXPECT_TRUE(reentering.getNode(info("late"), late)) << "a symbol made during the run";
+}
+
+} // namespace
