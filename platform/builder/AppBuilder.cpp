@@ -5,7 +5,7 @@
 #include "platform/icode/KV_ExprLocation.h"
 #include "platform/icode/KV_ICodeFactoryContainer.h"
 #include "platform/icode/KV_QualifiedSymbolOp.h"
-#include "platform/icode/KV_ScalingServer.h"
+#include "platform/icode/KV_ScaleServer.h"
 #include "platform/icode/KV_Statement.h"
 #include "platform/icode/KV_SymbolDB.h"
 #include "platform/icode/KvCCStmTable.h"
@@ -23,7 +23,7 @@
 
 AppBuilder::AppBuilder(const char* applicationName)
     : cvd(std::make_unique<KvCCodeViewData>(applicationName)) {
-  KvCIcSubApplication* sub = cvd->createSubApplication("Main");
+  KvCIcSubAppl* sub = cvd->createSubApplication("Main");
   unit = cvd->createCodeUnit("Unit");
   sub->addCodeUnit(unit);
   file("main.c");

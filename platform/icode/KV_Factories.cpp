@@ -21,7 +21,7 @@ KV_ICodeFactoryContainer::KV_ICodeFactoryContainer(KvCCodeViewData* owner)
 KV_DataTypeServer* KV_ICodeFactoryContainer::getDataTypeServer() const {
   return codeViewData->getDataTypeServer();
 }
-KV_ScalingServer* KV_ICodeFactoryContainer::getScalingServer() const {
+KV_ScaleServer* KV_ICodeFactoryContainer::getScalingServer() const {
   return codeViewData->getScalingServer();
 }
 KvCIcFileServer* KV_ICodeFactoryContainer::getFileServer() const {
@@ -31,11 +31,11 @@ KV_SymbolDB* KV_ICodeFactoryContainer::getSymbolDB() const { return codeViewData
 
 // --- locations and what they hold
 
-KV_ExprLocation* KV_ExprLocationFactory::createEmpty() {
+KV_ExprLocation* KV_ExprLocFactory::createEmpty() {
   return codeViewData->make<KV_ExprLocation>();
 }
 
-KV_ExprLocation* KV_ExprLocationFactory::createFromExpression(KvCIcExpression* expr) {
+KV_ExprLocation* KV_ExprLocFactory::createFromExpression(KvCIcExpression* expr) {
   if (!expr || expr->getParent() || expr->getContainingInitValue())
     return nullptr;
   KV_ExprLocation* loc = createEmpty();
@@ -43,60 +43,60 @@ KV_ExprLocation* KV_ExprLocationFactory::createFromExpression(KvCIcExpression* e
   return loc;
 }
 
-KV_ExprLocation* KV_ExprLocationFactory::createFromOperation(KV_Operation* op) {
+KV_ExprLocation* KV_ExprLocFactory::createFromOperation(KV_Operation* op) {
   return createFromExpression(op);
 }
 
-KV_ExprLocation* KV_ExprLocationFactory::createFromSymbol(KvCSymbol* symbol) {
+KV_ExprLocation* KV_ExprLocFactory::createFromSymbol(KvCSymbol* symbol) {
   KV_QualifiedSymbolOp* qso =
       codeViewData->getFactoryContainer()->getQSOFactory()->createQso(symbol);
   return qso ? createFromExpression(qso) : nullptr;
 }
 
-KV_ExprLocation* KV_ExprLocationFactory::createFromValue(std::int64_t value, KV_DataType* type,
+KV_ExprLocation* KV_ExprLocFactory::createFromValue(std::int64_t value, KV_DataType* type,
                                                          bool isUnsigned) {
   return createFromExpression(
       createConstant(isUnsigned ? KV_CONST_UNSIGNED : KV_CONST_SIGNED, value, type));
 }
 
-KV_ExprLocation* KV_ExprLocationFactory::createFromValue(double value, KV_DataType* type) {
+KV_ExprLocation* KV_ExprLocFactory::createFromValue(double value, KV_DataType* type) {
   return createFromExpression(createDoubleConstant(value, type));
 }
 
-KV_ExprLocation* KV_ExprLocationFactory::createFromString(const WmCXString& text, bool asCode,
+KV_ExprLocation* KV_ExprLocFactory::createFromString(const WmCXString& text, bool asCode,
                                                           bool quoted) {
   return createFromExpression(createString(text, asCode, quoted));
 }
 
-KV_ExprLocation* KV_ExprLocationFactory::createFromDataType(KV_DataType* type) {
+KV_ExprLocation* KV_ExprLocFactory::createFromDataType(KV_DataType* type) {
   KV_ExprLocation* loc = createEmpty();
   loc->setDataTypeRef(type);
   return loc;
 }
 
-KV_ExprLocation* KV_ExprLocationFactory::createFromFileId(KvCIcFileId* file) {
+KV_ExprLocation* KV_ExprLocFactory::createFromFileId(KvCIcFileId* file) {
   KV_ExprLocation* loc = createEmpty();
   loc->setFileIdRef(file);
   return loc;
 }
 
-KV_Constant* KV_ExprLocationFactory::createConstant(tagKvEConstantType type, std::int64_t value,
+KV_Constant* KV_ExprLocFactory::createConstant(tagKvEConstantType type, std::int64_t value,
                                                     KV_DataType* dt) {
   if (type == KV_CONST_DOUBLE)
     return createDoubleConstant(static_cast<double>(value), dt);
   return codeViewData->make<KV_Constant>(type, value, dt);
 }
 
-KV_Constant* KV_ExprLocationFactory::createDoubleConstant(double value, KV_DataType* dt) {
+KV_Constant* KV_ExprLocFactory::createDoubleConstant(double value, KV_DataType* dt) {
   return codeViewData->make<KV_Constant>(value, dt);
 }
 
-KvCStringExpr* KV_ExprLocationFactory::createString(const WmCXString& text, bool asCode,
+KvCStringExpr* KV_ExprLocFactory::createString(const WmCXString& text, bool asCode,
                                                     bool quoted) {
   return codeViewData->make<KvCStringExpr>(text, asCode, quoted);
 }
 
-KvCSmbInitValExpr* KV_ExprLocationFactory::createInitValue(const std::vector<int>& sizes) {
+KvCSmbInitValExpr* KV_ExprLocFactory::createInitValue(const std::vector<int>& sizes) {
   if (sizes.size() > 3)
     return nullptr;
   for (int size : sizes)

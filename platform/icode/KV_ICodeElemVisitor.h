@@ -20,7 +20,7 @@ class KvCCodeBlockOperation;
 class KvCIcApplication;
 class KvCIcCodeUnit;
 class KvCIcFileId;
-class KvCIcSubApplication;
+class KvCIcSubAppl;
 class KvCSmbInitValExpr;
 class KvCStringExpr;
 class KvCSymbol;
@@ -41,7 +41,7 @@ public:
   virtual void visitDataType(KV_DataType* type);
   virtual void visitQSO(KV_QualifiedSymbolOp* qso);
   virtual void visitIcApplication(KvCIcApplication* app);
-  virtual void visitIcSubApplication(KvCIcSubApplication* sub);
+  virtual void visitIcSubApplication(KvCIcSubAppl* sub);
   virtual void visitIcCodeUnit(KvCIcCodeUnit* unit);
   virtual void visitIcFileId(KvCIcFileId* file);
   virtual bool stopIteration();

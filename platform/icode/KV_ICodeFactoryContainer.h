@@ -3,13 +3,13 @@
 #ifndef HUL_PLATFORM_ICODE_KV_ICODEFACTORYCONTAINER_H
 #define HUL_PLATFORM_ICODE_KV_ICODEFACTORYCONTAINER_H
 
-#include "platform/icode/KV_ExprLocationFactory.h"
+#include "platform/icode/KV_ExprLocFactory.h"
 #include "platform/icode/KV_OperationFactory.h"
 #include "platform/icode/KV_QSOFactory.h"
 #include "platform/icode/KV_StatementFactory.h"
 
 class KV_DataTypeServer;
-class KV_ScalingServer;
+class KV_ScaleServer;
 class KV_SymbolDB;
 class KvCIcFileServer;
 
@@ -19,18 +19,18 @@ public:
   KV_ICodeFactoryContainer(const KV_ICodeFactoryContainer&) = delete;
   KV_ICodeFactoryContainer& operator=(const KV_ICodeFactoryContainer&) = delete;
 
-  KV_ExprLocationFactory* getExprLocFactory() { return &locations; }
+  KV_ExprLocFactory* getExprLocFactory() { return &locations; }
   KV_OperationFactory* getOperationFactory() { return &operations; }
   KV_QSOFactory* getQSOFactory() { return &qsos; }
   KV_StatementFactory* getStatementFactory() { return &statements; }
   KV_DataTypeServer* getDataTypeServer() const;
-  KV_ScalingServer* getScalingServer() const;
+  KV_ScaleServer* getScalingServer() const;
   KvCIcFileServer* getFileServer() const;
   KV_SymbolDB* getSymbolDB() const;
 
 private:
   KvCCodeViewData* codeViewData;
-  KV_ExprLocationFactory locations;
+  KV_ExprLocFactory locations;
   KV_OperationFactory operations;
   KV_QSOFactory qsos;
   KV_StatementFactory statements;

@@ -1,5 +1,5 @@
 // KV_Scaling: the fixed-point scaling of a value: physical = lsb * implemented + offset.
-// Scalings are made and owned by KV_ScalingServer, one per (lsb, offset).
+// Scalings are made and owned by KV_ScaleServer, one per (lsb, offset).
 #ifndef HUL_PLATFORM_ICODE_KV_SCALING_H
 #define HUL_PLATFORM_ICODE_KV_SCALING_H
 

@@ -3,7 +3,7 @@
 #include "platform/icode/KV_DataTypeServer.h"
 #include "platform/icode/KV_ICodeElem.h"
 #include "platform/icode/KV_ICodeFactoryContainer.h"
-#include "platform/icode/KV_ScalingServer.h"
+#include "platform/icode/KV_ScaleServer.h"
 #include "platform/icode/KV_SymbolDB.h"
 #include "platform/icode/KvCExprLocDB.h"
 #include "platform/icode/KvCExprLocDBServer.h"
@@ -34,7 +34,7 @@ KvCCodeViewData::KvCCodeViewData(const WmCXString& applicationName)
     : application(std::make_unique<KvCIcApplication>(applicationName)),
       srcRefServer(std::make_unique<KvCSrcRefServer>()),
       typeServer(std::make_unique<KV_DataTypeServer>()),
-      scalingServer(std::make_unique<KV_ScalingServer>()),
+      scalingServer(std::make_unique<KV_ScaleServer>()),
       fileServer(std::make_unique<KvCIcFileServer>(this)),
       symbolDB(std::make_unique<KV_SymbolDB>()),
       dbServer(std::make_unique<KvCExprLocDBServer>(this)),
@@ -77,8 +77,8 @@ KV_OpConversionLevel* KvCCodeViewData::getConversionLevel(tagKvEConversionLevel 
   return levels[level].get();
 }
 
-KvCIcSubApplication* KvCCodeViewData::createSubApplication(const WmCXString& name) {
-  subApplications.push_back(std::make_unique<KvCIcSubApplication>(name));
+KvCIcSubAppl* KvCCodeViewData::createSubApplication(const WmCXString& name) {
+  subApplications.push_back(std::make_unique<KvCIcSubAppl>(name));
   application->addSubApplication(subApplications.back().get());
   return subApplications.back().get();
 }

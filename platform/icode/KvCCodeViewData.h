@@ -21,13 +21,13 @@
 class KV_DataTypeServer;
 class KV_ICodeElem;
 class KV_ICodeFactoryContainer;
-class KV_ScalingServer;
+class KV_ScaleServer;
 class KV_SymbolDB;
 class KvCExprLocDBServer;
 class KvCIcApplication;
 class KvCIcCodeUnit;
 class KvCIcFileServer;
-class KvCIcSubApplication;
+class KvCIcSubAppl;
 class KvCNameSpace;
 class KvCRtosProtection;
 class KvCSrcRefServer;
@@ -51,13 +51,13 @@ public:
   KvCSrcRefServer* getSrcRefServer() const { return srcRefServer.get(); }
   KV_SymbolDB* getSymbolDB() const { return symbolDB.get(); }
   KV_DataTypeServer* getDataTypeServer() const { return typeServer.get(); }
-  KV_ScalingServer* getScalingServer() const { return scalingServer.get(); }
+  KV_ScaleServer* getScalingServer() const { return scalingServer.get(); }
   KvCIcFileServer* getFileServer() const { return fileServer.get(); }
   KV_ICodeFactoryContainer* getFactoryContainer() const { return factories.get(); }
   KV_OpConversionLevel* getConversionLevel(tagKvEConversionLevel level) const;
 
   // Parts of the application tree and descriptors; owned here.
-  KvCIcSubApplication* createSubApplication(const WmCXString& name);
+  KvCIcSubAppl* createSubApplication(const WmCXString& name);
   KvCIcCodeUnit* createCodeUnit(const WmCXString& name);
   KvCTaskActivation* createTaskActivation(int kind, const WmCXString& taskName);
   KvCRtosProtection* createRtosProtection(const WmCXString& resourceName);
@@ -86,7 +86,7 @@ private:
   std::size_t blockSize = 0;
   std::vector<KV_ICodeElem*> elements;
   std::unique_ptr<KvCIcApplication> application;
-  std::vector<std::unique_ptr<KvCIcSubApplication>> subApplications;
+  std::vector<std::unique_ptr<KvCIcSubAppl>> subApplications;
   std::vector<std::unique_ptr<KvCIcCodeUnit>> codeUnits;
   std::vector<std::unique_ptr<KvCTaskActivation>> taskActivations;
   std::vector<std::unique_ptr<KvCRtosProtection>> protections;
@@ -94,7 +94,7 @@ private:
   std::unique_ptr<KV_OpConversionLevel> levels[KV_CONV_NUMBER_OF_LEVELS];
   std::unique_ptr<KvCSrcRefServer> srcRefServer;
   std::unique_ptr<KV_DataTypeServer> typeServer;
-  std::unique_ptr<KV_ScalingServer> scalingServer;
+  std::unique_ptr<KV_ScaleServer> scalingServer;
   std::unique_ptr<KvCIcFileServer> fileServer;
   std::unique_ptr<KV_SymbolDB> symbolDB;
   std::unique_ptr<KvCExprLocDBServer> dbServer;

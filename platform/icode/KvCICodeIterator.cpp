@@ -27,7 +27,7 @@ void KV_ICodeElemVisitor::visitCodeBlockOperation(KvCCodeBlockOperation*) {}
 void KV_ICodeElemVisitor::visitDataType(KV_DataType*) {}
 void KV_ICodeElemVisitor::visitQSO(KV_QualifiedSymbolOp*) {}
 void KV_ICodeElemVisitor::visitIcApplication(KvCIcApplication*) {}
-void KV_ICodeElemVisitor::visitIcSubApplication(KvCIcSubApplication*) {}
+void KV_ICodeElemVisitor::visitIcSubApplication(KvCIcSubAppl*) {}
 void KV_ICodeElemVisitor::visitIcCodeUnit(KvCIcCodeUnit*) {}
 void KV_ICodeElemVisitor::visitIcFileId(KvCIcFileId*) {}
 bool KV_ICodeElemVisitor::stopIteration() { return false; }
@@ -152,7 +152,7 @@ bool KvCICodeIterator::iterate(KvCIcApplication* app, KV_ICodeElemVisitor* visit
   if (visitor->stopIteration())
     return true;
   visitor->visitIcApplication(app);
-  for (KvCIcSubApplication* sub : app->getSubApplications()) {
+  for (KvCIcSubAppl* sub : app->getSubApplications()) {
     if (visitor->stopIteration())
       return true;
     visitor->visitIcSubApplication(sub);

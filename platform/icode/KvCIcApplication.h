@@ -24,9 +24,9 @@ private:
   std::vector<KvCIcFileId*> files;
 };
 
-class HUL_PLATFORM_API KvCIcSubApplication {
+class HUL_PLATFORM_API KvCIcSubAppl {
 public:
-  explicit KvCIcSubApplication(WmCXString subName) : name(std::move(subName)) {}
+  explicit KvCIcSubAppl(WmCXString subName) : name(std::move(subName)) {}
   const WmCXString& getName() const { return name; }
   const std::vector<KvCIcCodeUnit*>& getCodeUnits() const { return codeUnits; }
   void addCodeUnit(KvCIcCodeUnit* unit) { codeUnits.push_back(unit); }
@@ -40,12 +40,12 @@ class HUL_PLATFORM_API KvCIcApplication {
 public:
   explicit KvCIcApplication(WmCXString appName) : name(std::move(appName)) {}
   const WmCXString& getName() const { return name; }
-  const std::vector<KvCIcSubApplication*>& getSubApplications() const { return subApplications; }
-  void addSubApplication(KvCIcSubApplication* sub) { subApplications.push_back(sub); }
+  const std::vector<KvCIcSubAppl*>& getSubApplications() const { return subApplications; }
+  void addSubApplication(KvCIcSubAppl* sub) { subApplications.push_back(sub); }
 
 private:
   WmCXString name;
-  std::vector<KvCIcSubApplication*> subApplications;
+  std::vector<KvCIcSubAppl*> subApplications;
 };
 
 #endif

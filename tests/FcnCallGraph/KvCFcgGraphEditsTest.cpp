@@ -4,7 +4,7 @@
 // whatever deletes its edge, and the hooks must run in the documented order.
 #include "FcgTestSupport.h"
 #include "HulCvTools/FcnCallGraph/KvCFunctionCallGraph.h"
-#include "platform/icode/KV_ExprLocationFactory.h"
+#include "platform/icode/KV_ExprLocFactory.h"
 #include "platform/icode/KV_ICodeFactoryContainer.h"
 #include "platform/icode/KV_OperationFactory.h"
 

@@ -3,7 +3,7 @@
 #include "HulCvTools/FcnCallGraph/KvCFcgQuery.h"
 #include "HulCvTools/FcnCallGraph/KvCFcnSmbVisitor.h"
 #include "HulCvTools/FcnCallGraph/KvCFunctionCallGraph.h"
-#include "platform/icode/KV_ExprLocationFactory.h"
+#include "platform/icode/KV_ExprLocFactory.h"
 #include "platform/icode/KV_ICodeFactoryContainer.h"
 #include "platform/icode/KV_OperationFactory.h"
 #include "platform/icode/KV_SymbolDB.h"

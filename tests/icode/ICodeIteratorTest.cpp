@@ -155,7 +155,7 @@ struct TwoUnitApp : SmallApp {
   TwoUnitApp() {
     app.file("b.c");
     app.variable("y", app.int8());
-    KvCIcSubApplication* sub = app.data().createSubApplication("Second");
+    KvCIcSubAppl* sub = app.data().createSubApplication("Second");
     KvCIcCodeUnit* empty = app.data().createCodeUnit("Empty");
     KvCIcCodeUnit* unit = app.data().createCodeUnit("U2");
     sub->addCodeUnit(empty);

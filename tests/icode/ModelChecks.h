@@ -167,7 +167,7 @@ public:
   void visitDataType(KV_DataType* t) override { add("Type:" + t->getName().str()); }
   void visitQSO(KV_QualifiedSymbolOp* q) override { add("QSO:" + q->getSymbol()->getName().str()); }
   void visitIcApplication(KvCIcApplication* a) override { add("App:" + a->getName().str()); }
-  void visitIcSubApplication(KvCIcSubApplication* s) override { add("Sub:" + s->getName().str()); }
+  void visitIcSubApplication(KvCIcSubAppl* s) override { add("Sub:" + s->getName().str()); }
   void visitIcCodeUnit(KvCIcCodeUnit* u) override { add("Unit:" + u->getName().str()); }
   void visitIcFileId(KvCIcFileId* f) override { add("File:" + f->getName().str()); }
   bool stopIteration() override {

@@ -254,7 +254,7 @@ TEST(ParentCoherenceTest, InitialValueRefusesBadElements) {
 // up with two holders once the value is placed.
 TEST(ParentCoherenceTest, ElementOfAnUnplacedInitialValueIsNotFree) {
   AppBuilder app;
-  KV_ExprLocationFactory* locs = app.factories().getExprLocFactory();
+  KV_ExprLocFactory* locs = app.factories().getExprLocFactory();
   KvCSmbInitValExpr* init = locs->createInitValue({});
   KV_Constant* c = app.constantExpr(1);
   ASSERT_TRUE(init->addElement(c));
@@ -362,7 +362,7 @@ TEST(ParentCoherenceTest, LocationCannotBecomeAnOperandInsideItself) {
 
 TEST(ParentCoherenceTest, InitialValueCannotCloseACycle) {
   AppBuilder app;
-  KV_ExprLocationFactory* locs = app.factories().getExprLocFactory();
+  KV_ExprLocFactory* locs = app.factories().getExprLocFactory();
   // A placed value: its holder is an operand of an operation that would become an element.
   KvCSmbInitValExpr* placed = locs->createInitValue({2});
   KV_ExprLocation* holder = locs->createFromExpression(placed);

@@ -25,7 +25,7 @@ namespace {
 
 struct Constants {
   AppBuilder app;
-  KV_ExprLocationFactory* f = app.factories().getExprLocFactory();
+  KV_ExprLocFactory* f = app.factories().getExprLocFactory();
   KV_Constant* make(tagKvEConstantType t, std::int64_t v, KV_DataType* dt = nullptr) {
     return f->createConstant(t, v, dt);
   }

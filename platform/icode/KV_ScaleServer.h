@@ -1,6 +1,6 @@
-// KV_ScalingServer: makes and owns the scalings, one per (lsb, offset).
-#ifndef HUL_PLATFORM_ICODE_KV_SCALINGSERVER_H
-#define HUL_PLATFORM_ICODE_KV_SCALINGSERVER_H
+// KV_ScaleServer: makes and owns the scalings, one per (lsb, offset).
+#ifndef HUL_PLATFORM_ICODE_KV_SCALESERVER_H
+#define HUL_PLATFORM_ICODE_KV_SCALESERVER_H
 
 #include "platform/icode/KV_Scaling.h"
 
@@ -8,7 +8,7 @@
 #include <memory>
 #include <utility>
 
-class HUL_PLATFORM_API KV_ScalingServer {
+class HUL_PLATFORM_API KV_ScaleServer {
 public:
   // Null for a non-finite or zero LSB, or a non-finite offset.
   KV_Scaling* demandScaling(double lsb, double offset);

@@ -1,7 +1,7 @@
-// KV_ExprLocationFactory: makes expression locations and what they hold. Every location
+// KV_ExprLocFactory: makes expression locations and what they hold. Every location
 // is new and without parent; the code view data owns it.
-#ifndef HUL_PLATFORM_ICODE_KV_EXPRLOCATIONFACTORY_H
-#define HUL_PLATFORM_ICODE_KV_EXPRLOCATIONFACTORY_H
+#ifndef HUL_PLATFORM_ICODE_KV_EXPRLOCFACTORY_H
+#define HUL_PLATFORM_ICODE_KV_EXPRLOCFACTORY_H
 
 #include "platform/icode/KV_Constant.h"
 #include "platform/support/WmCXString.h"
@@ -15,9 +15,9 @@ class KvCSmbInitValExpr;
 class KvCStringExpr;
 class KvCSymbol;
 
-class HUL_PLATFORM_API KV_ExprLocationFactory {
+class HUL_PLATFORM_API KV_ExprLocFactory {
 public:
-  explicit KV_ExprLocationFactory(KvCCodeViewData* owner) : codeViewData(owner) {}
+  explicit KV_ExprLocFactory(KvCCodeViewData* owner) : codeViewData(owner) {}
 
   KV_ExprLocation* createEmpty();
   // A location holding `expr`; null when `expr` is null or held elsewhere.

@@ -1,8 +1,8 @@
-#include "platform/icode/KV_ScalingServer.h"
+#include "platform/icode/KV_ScaleServer.h"
 
 #include <cmath>
 
-KV_Scaling* KV_ScalingServer::demandScaling(double lsb, double offset) {
+KV_Scaling* KV_ScaleServer::demandScaling(double lsb, double offset) {
   if (!std::isfinite(lsb) || lsb == 0.0 || !std::isfinite(offset))
     return nullptr;
   std::unique_ptr<KV_Scaling>& slot = scalings[{lsb, offset}];
