@@ -7,5 +7,7 @@ class KV_BdPartition;
 class KvCCbActualInterface;
 class KvCIvData;
 class KvCRoDatabase;
+class KvCRoDataTypes;
+class KvCRoRTOSInfo;
 
 #endif

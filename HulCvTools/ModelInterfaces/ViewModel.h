@@ -4,5 +4,15 @@
 
 #include "HulCvTools/ModelInterfaces/ViewFwd.h"
 #include "platform/view/KvCIvData.h"
+#include "platform/view/KvCRoAlarm.h"
+#include "platform/view/KvCRoCounter.h"
+#include "platform/view/KvCRoCounterAPI.h"
+#include "platform/view/KvCRoCounterAPIFcn.h"
+#include "platform/view/KvCRoDataTypes.h"
+#include "platform/view/KvCRoDatabase.h"
+#include "platform/view/KvCRoEvent.h"
+#include "platform/view/KvCRoMessage.h"
+#include "platform/view/KvCRoRTOSInfo.h"
+#include "platform/view/KvCRoResource.h"
 
 #endif

@@ -15,6 +15,18 @@ bool KV_DataType::isEqualType(KV_DataType* other) const {
   return kind == other->kind && hasEqualStructure(*other);
 }
 
+namespace {
+const KV_DataType* endOfBaseChain(const KV_DataType* type) {
+  while (KV_DataType* base = type->getBaseType())
+    type = base;
+  return type;
+}
+} // namespace
+
+bool KV_DataType::isSameType(KV_DataType* other) const {
+  return other && endOfBaseChain(this) == endOfBaseChain(other);
+}
+
 KvCExprLocDB* KV_DataType::getExprLocDB() {
   if (!db)
     db = std::make_unique<KvCExprLocDB>();

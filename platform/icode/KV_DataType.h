@@ -7,10 +7,23 @@
 // names (a base type and its typedefs): isEqualType compares structure (width,
 // signedness, pointed-to and element types), isEqualTypeRef compares identity.
 //
+// A named type is a typedef of another type, its base type (getBaseType): a named numerical
+// type has its base's width and signedness, a named pointer points where its base pointer
+// points. A Data Dictionary type is a named type that the Data Dictionary specifies; it may
+// have no base type. Base types (Int8, UInt8, ..., Float64, Bool), unnamed pointers,
+// arrays, structures and void have no base type: getBaseType answers null for them.
+// isSameType compares identity after following base types to the end of the chain, so a
+// named type is the same type as its base; isEqualType compares structure.
+//
+// The servers set what makes a type named when they make it (base type, description,
+// dimensions, flags, source reference); afterwards only the module file (set when a file
+// defines the type) and the use-name-for-casts mark change.
+//
 // Each type owns its expression-location database, made on first demand.
 #ifndef HUL_PLATFORM_ICODE_KV_DATATYPE_H
 #define HUL_PLATFORM_ICODE_KV_DATATYPE_H
 
+#include "platform/icode/KV_DimensionDescriptor.h"
 #include "platform/support/HulPlatformExport.h"
 #include "platform/support/WmCXString.h"
 
@@ -23,6 +36,8 @@ class KV_NumericalType;
 class KV_PointerType;
 class KV_StructType;
 class KvCExprLocDB;
+class KvCIcFileId;
+class KvCSrcRef;
 
 enum tagKvEDataTypeKind {
   KV_TYPE_VOID,
@@ -53,19 +68,64 @@ public:
   bool isEqualType(KV_DataType* other) const;
   bool isEqualTypeRef(KV_DataType* other) const { return this == other; }
 
+  // The type this named type is made from, or null for a type that is not made from
+  // another (base types among them).
+  virtual KV_DataType* getBaseType() const { return naming.base; }
+  // Whether both are the same type once each is followed through its base types to the
+  // end of the chain. False for null.
+  virtual bool isSameType(KV_DataType* other) const;
+  // False for arrays and for named types with dimensions.
+  virtual bool isScalar() const { return naming.dims.isScalar(); }
+  // Whether the type's name is written as a typedef where the type is defined; without it
+  // C code spells the type out instead of using the name.
+  virtual bool isCreateTypedef() const { return naming.createTypedef; }
+  // The file whose header defines the type, or null: set by KvCIcFile::defineType, or by
+  // the Data Dictionary for its types.
+  virtual KvCIcFileId* getModuleFileId() const { return moduleFile; }
+  // Where a named type was made, or null (for types made without a caller's reference:
+  // base types, void, unnamed pointers, arrays, structures).
+  virtual const KvCSrcRef* getSrcRef() const { return naming.srcRef; }
+  // The description of a named type; empty for other types.
+  const WmCXString& getDescription() const { return naming.description; }
+  // The dimensions of a named type (scalar for other types).
+  const KV_DimensionDescriptor& getDimensions() const { return naming.dims; }
+  bool isDataDictionaryType() const { return naming.dataDictionary; }
+  // Whether the type belongs to the RTOS interface (its name and meaning are the RTOS's).
+  bool isRtosType() const { return naming.rtosType; }
+  // Whether casts to this type are written with its name rather than its base type.
+  bool isUseNameForCasts() const { return useNameForCasts; }
+  void setUseNameForCasts(bool value) { useNameForCasts = value; }
+
   KvCExprLocDB* getExprLocDB();
   // The database if it was made already, else null (no creation).
   KvCExprLocDB* findExprLocDB() const { return db.get(); }
+
+  // What makes a type named; given once, by the type servers, when they make the type.
+  struct Naming {
+    KV_DataType* base = nullptr;
+    WmCXString description;
+    KV_DimensionDescriptor dims;
+    bool createTypedef = false;
+    bool dataDictionary = false;
+    bool rtosType = false;
+    const KvCSrcRef* srcRef = nullptr;
+  };
 
 protected:
   KV_DataType(int id, tagKvEDataTypeKind k, WmCXString typeName);
   virtual bool hasEqualStructure(const KV_DataType& other) const = 0;
 
 private:
+  friend class KV_DataTypeServer; // names the types it makes
+  friend class KvCIcFile;         // records the file that defines the type
+
   int typeId;
   tagKvEDataTypeKind kind;
   WmCXString name;
   std::unique_ptr<KvCExprLocDB> db;
+  Naming naming;
+  KvCIcFileId* moduleFile = nullptr;
+  bool useNameForCasts = false;
 };
 
 class HUL_PLATFORM_API KV_VoidType : public KV_DataType {
@@ -148,6 +208,7 @@ public:
   KV_ArrayType(int id, WmCXString typeName, KV_DataType* element, int elementCount);
 
   KV_ArrayType* asArrayType() override { return this; }
+  bool isScalar() const override { return false; }
   KV_DataType* getElementType() const { return elementType; }
   int getSize() const { return size; }
 

@@ -1,6 +1,10 @@
 #include "platform/icode/KV_DataTypeServer.h"
 
-KV_DataTypeServer::KV_DataTypeServer() = default;
+#include "platform/icode/KV_PointerTypeServer.h"
+
+KV_DataTypeServer::KV_DataTypeServer()
+    : pointerServer(std::make_unique<KV_PointerTypeServer>(this)) {}
+
 KV_DataTypeServer::~KV_DataTypeServer() = default;
 
 template <class T> T* KV_DataTypeServer::adopt(std::unique_ptr<T> type) {
@@ -8,6 +12,21 @@ template <class T> T* KV_DataTypeServer::adopt(std::unique_ptr<T> type) {
   types.push_back(std::move(type));
   return result;
 }
+
+template <class T>
+T* KV_DataTypeServer::adoptNamed(std::unique_ptr<T> type, KV_DataType::Naming naming) {
+  if (findType(type->getName()))
+    return nullptr;
+  type->naming = std::move(naming);
+  T* result = adopt(std::move(type));
+  byName.emplace(result->getName(), result);
+  return result;
+}
+
+template KV_NumericalType* KV_DataTypeServer::adoptNamed(std::unique_ptr<KV_NumericalType>,
+                                                         KV_DataType::Naming);
+template KV_PointerType* KV_DataTypeServer::adoptNamed(std::unique_ptr<KV_PointerType>,
+                                                       KV_DataType::Naming);
 
 KV_NumericalType* KV_DataTypeServer::demandNumericalType(const WmCXString& name, int bits,
                                                          bool isSigned, bool isFloat) {
@@ -62,4 +81,69 @@ KV_StructType* KV_DataTypeServer::demandStructType(const WmCXString& name) {
 KV_DataType* KV_DataTypeServer::findType(const WmCXString& name) const {
   auto it = byName.find(name);
   return it == byName.end() ? nullptr : it->second;
+}
+
+KV_NumericalType* KV_DataTypeServer::demandBaseType(const WmCXString& name) {
+  static const struct {
+    const char* name;
+    KV_NumericalType* (KV_DataTypeServer::*demand)();
+  } kBaseTypes[] = {
+      {"Int8", &KV_DataTypeServer::getInt8},       {"UInt8", &KV_DataTypeServer::getUInt8},
+      {"Int16", &KV_DataTypeServer::getInt16},     {"UInt16", &KV_DataTypeServer::getUInt16},
+      {"Int32", &KV_DataTypeServer::getInt32},     {"UInt32", &KV_DataTypeServer::getUInt32},
+      {"Float32", &KV_DataTypeServer::getFloat32}, {"Float64", &KV_DataTypeServer::getFloat64},
+      {"Bool", &KV_DataTypeServer::getBool},
+  };
+  for (const auto& base : kBaseTypes)
+    if (name == base.name)
+      return (this->*base.demand)();
+  return nullptr;
+}
+
+KV_DataType* KV_DataTypeServer::findTypeByName(const WmCXString& name,
+                                               const KvCSrcRef* /*srcRef*/) {
+  if (KV_DataType* existing = findType(name))
+    return existing;
+  return demandBaseType(name);
+}
+
+KV_DataType* KV_DataTypeServer::findTypeByName(const WmCXString& name, KV_DimensionDescriptor& dims,
+                                               const KvCSrcRef* srcRef, bool fromDataDictionary) {
+  KV_DataType* type = fromDataDictionary ? findType(name) : findTypeByName(name, srcRef);
+  if (!type || type->isDataDictionaryType() != fromDataDictionary)
+    return nullptr;
+  dims = type->getDimensions();
+  return type;
+}
+
+KV_NumericalType* KV_DataTypeServer::registerDataDictionaryType(
+    const WmCXString& name, KV_DataType* baseType, const KV_DimensionDescriptor& dims,
+    bool createTypedef, KvCIcFileId* module, const KvCSrcRef* srcRef) {
+  KV_NumericalType* base = baseType ? baseType->getNumericalType() : nullptr;
+  if (name.isEmpty() || (baseType && !base))
+    return nullptr;
+  auto type = base ? std::make_unique<KV_NumericalType>(nextTypeId(), name, base->getBits(),
+                                                        base->isSigned(), base->isFloat())
+                   : std::make_unique<KV_NumericalType>(nextTypeId(), name, 32, true, false);
+  KV_DataType::Naming naming;
+  naming.base = base;
+  naming.dims = dims;
+  naming.createTypedef = createTypedef;
+  naming.dataDictionary = true;
+  naming.srcRef = srcRef;
+  KV_NumericalType* result = adoptNamed(std::move(type), std::move(naming));
+  if (result)
+    result->moduleFile = module;
+  return result;
+}
+
+KV_NumericalType* KV_DataTypeServer::registerDataDictionaryType(const WmCXString& name,
+                                                                KV_DataType* baseType, bool scalar,
+                                                                bool createTypedef,
+                                                                KvCIcFileId* module,
+                                                                const KvCSrcRef* srcRef) {
+  KV_DimensionDescriptor dims;
+  if (!scalar)
+    dims.addDimension(2);
+  return registerDataDictionaryType(name, baseType, dims, createTypedef, module, srcRef);
 }

@@ -21,6 +21,12 @@ KV_ICodeFactoryContainer::KV_ICodeFactoryContainer(KvCCodeViewData* owner)
 KV_DataTypeServer* KV_ICodeFactoryContainer::getDataTypeServer() const {
   return codeViewData->getDataTypeServer();
 }
+KV_BaseTypeServer* KV_ICodeFactoryContainer::getBaseTypeServer() const {
+  return codeViewData->getBaseTypeServer();
+}
+KV_NumericalTypeServer* KV_ICodeFactoryContainer::getNumTypeServer() const {
+  return codeViewData->getNumTypeServer();
+}
 KV_ScaleServer* KV_ICodeFactoryContainer::getScalingServer() const {
   return codeViewData->getScalingServer();
 }

@@ -8,7 +8,9 @@
 #include "platform/icode/KV_QSOFactory.h"
 #include "platform/icode/KV_StatementFactory.h"
 
+class KV_BaseTypeServer;
 class KV_DataTypeServer;
+class KV_NumericalTypeServer;
 class KV_ScaleServer;
 class KV_SymbolDB;
 class KvCIcFileServer;
@@ -24,6 +26,8 @@ public:
   KV_QSOFactory* getQSOFactory() { return &qsos; }
   KV_StatementFactory* getStatementFactory() { return &statements; }
   KV_DataTypeServer* getDataTypeServer() const;
+  KV_BaseTypeServer* getBaseTypeServer() const;
+  KV_NumericalTypeServer* getNumTypeServer() const;
   KV_ScaleServer* getScalingServer() const;
   KvCIcFileServer* getFileServer() const;
   KV_SymbolDB* getSymbolDB() const;

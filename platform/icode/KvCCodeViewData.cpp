@@ -1,8 +1,10 @@
 #include "platform/icode/KvCCodeViewData.h"
 
+#include "platform/icode/KV_BaseTypeServer.h"
 #include "platform/icode/KV_DataTypeServer.h"
 #include "platform/icode/KV_ICodeElem.h"
 #include "platform/icode/KV_ICodeFactoryContainer.h"
+#include "platform/icode/KV_NumericalTypeServer.h"
 #include "platform/icode/KV_ScaleServer.h"
 #include "platform/icode/KV_SymbolDB.h"
 #include "platform/icode/KvCExprLocDB.h"
@@ -34,6 +36,8 @@ KvCCodeViewData::KvCCodeViewData(const WmCXString& applicationName)
     : application(std::make_unique<KvCIcApplication>(applicationName)),
       srcRefServer(std::make_unique<KvCSrcRefServer>()),
       typeServer(std::make_unique<KV_DataTypeServer>()),
+      baseTypeServer(std::make_unique<KV_BaseTypeServer>(typeServer.get())),
+      numTypeServer(std::make_unique<KV_NumericalTypeServer>(typeServer.get())),
       scalingServer(std::make_unique<KV_ScaleServer>()),
       fileServer(std::make_unique<KvCIcFileServer>(this)),
       symbolDB(std::make_unique<KV_SymbolDB>()),
@@ -52,6 +56,8 @@ KvCCodeViewData::~KvCCodeViewData() {
   dbServer.reset();
   symbolDB.reset();
   fileServer.reset();
+  numTypeServer.reset();
+  baseTypeServer.reset();
   typeServer.reset();
   for (auto it = elements.rbegin(); it != elements.rend(); ++it)
     (*it)->~KV_ICodeElem();
@@ -124,23 +130,4 @@ void KvCExprLocDBServer::clearExprLocDBs() {
   for (int i = 0; i < files->getNumberOfFiles(); ++i)
     if (KvCExprLocDB* db = files->getFile(i)->findExprLocDB())
       db->clear();
-}
-
-KvCIcFileServer::~KvCIcFileServer() = default;
-
-KvCIcFileId* KvCIcFileServer::demandFile(const WmCXString& name) {
-  if (KvCIcFileId* existing = findFile(name))
-    return existing;
-  files.push_back(std::make_unique<KvCIcFileId>(getNumberOfFiles(), name));
-  KvCIcFileId* file = files.back().get();
-  byName.emplace(name, file);
-  KvCCStmTable* table =
-      codeViewData->getFactoryContainer()->getStatementFactory()->createCStmTable(nullptr, file);
-  file->getFile()->setStatementTable(table);
-  return file;
-}
-
-KvCIcFileId* KvCIcFileServer::findFile(const WmCXString& name) const {
-  auto it = byName.find(name);
-  return it == byName.end() ? nullptr : it->second;
 }

@@ -18,9 +18,11 @@
 #include <utility>
 #include <vector>
 
+class KV_BaseTypeServer;
 class KV_DataTypeServer;
 class KV_ICodeElem;
 class KV_ICodeFactoryContainer;
+class KV_NumericalTypeServer;
 class KV_ScaleServer;
 class KV_SymbolDB;
 class KvCExprLocDBServer;
@@ -29,6 +31,7 @@ class KvCIcCodeUnit;
 class KvCIcFileServer;
 class KvCIcSubAppl;
 class KvCNameSpace;
+class KvCRoDatabase;
 class KvCRtosProtection;
 class KvCSrcRefServer;
 class KvCTaskActivation;
@@ -51,10 +54,17 @@ public:
   KvCSrcRefServer* getSrcRefServer() const { return srcRefServer.get(); }
   KV_SymbolDB* getSymbolDB() const { return symbolDB.get(); }
   KV_DataTypeServer* getDataTypeServer() const { return typeServer.get(); }
+  KV_BaseTypeServer* getBaseTypeServer() const { return baseTypeServer.get(); }
+  KV_NumericalTypeServer* getNumTypeServer() const { return numTypeServer.get(); }
   KV_ScaleServer* getScalingServer() const { return scalingServer.get(); }
   KvCIcFileServer* getFileServer() const { return fileServer.get(); }
   KV_ICodeFactoryContainer* getFactoryContainer() const { return factories.get(); }
   KV_OpConversionLevel* getConversionLevel(tagKvEConversionLevel level) const;
+
+  // The RTOS database of the run, or null when none was set. Not owned: whoever makes the
+  // database keeps it, and it must outlive every use through the code view data.
+  KvCRoDatabase* getRtosDatabase() const { return rtosDatabase; }
+  void setRtosDatabase(KvCRoDatabase* database) { rtosDatabase = database; }
 
   // Parts of the application tree and descriptors; owned here.
   KvCIcSubAppl* createSubApplication(const WmCXString& name);
@@ -94,11 +104,14 @@ private:
   std::unique_ptr<KV_OpConversionLevel> levels[KV_CONV_NUMBER_OF_LEVELS];
   std::unique_ptr<KvCSrcRefServer> srcRefServer;
   std::unique_ptr<KV_DataTypeServer> typeServer;
+  std::unique_ptr<KV_BaseTypeServer> baseTypeServer;
+  std::unique_ptr<KV_NumericalTypeServer> numTypeServer;
   std::unique_ptr<KV_ScaleServer> scalingServer;
   std::unique_ptr<KvCIcFileServer> fileServer;
   std::unique_ptr<KV_SymbolDB> symbolDB;
   std::unique_ptr<KvCExprLocDBServer> dbServer;
   std::unique_ptr<KV_ICodeFactoryContainer> factories;
+  KvCRoDatabase* rtosDatabase = nullptr;
 };
 
 #endif

@@ -1,13 +1,23 @@
 // KvCIcFile: the properties of one generated file: whether it is a stub or artificial,
-// its code generation basis, who is responsible for it, its top-level statement table
-// and its complementary file (the header of a source file and vice versa).
+// its code generation basis, who is responsible for it, its top-level statement table,
+// its complementary file (the header of a source file and vice versa) and the types it
+// defines, in definition order.
+//
+// A file is part of its file id (getFileId), which owns it. A type is defined in at most
+// one file, its module file; the file points to the types it defines, which the data type
+// server owns. Fixtures can make defineType fail (setDefineTypeFails).
 #ifndef HUL_PLATFORM_ICODE_KVCICFILE_H
 #define HUL_PLATFORM_ICODE_KVCICFILE_H
 
 #include "platform/support/HulPlatformExport.h"
 
+#include <unordered_set>
+#include <vector>
+
+class KV_DataType;
 class KvCCStmTable;
 class KvCIcFileId;
+class KvCSrcRef;
 
 enum tagKvECodegenBase {
   KV_CODEGEN_BASE_MODEL = 0,
@@ -22,6 +32,11 @@ enum tagKvEFileResponsibility {
 
 class HUL_PLATFORM_API KvCIcFile {
 public:
+  explicit KvCIcFile(KvCIcFileId* owner) : fileId(owner) {}
+  KvCIcFile(const KvCIcFile&) = delete;
+  KvCIcFile& operator=(const KvCIcFile&) = delete;
+
+  KvCIcFileId* getFileId() const { return fileId; }
   bool isStubFile() const { return stub; }
   void setStubFile(bool value) { stub = value; }
   bool isArtificial() const { return artificial; }
@@ -35,13 +50,30 @@ public:
   KvCIcFileId* getComplementaryFile() const { return complementary; }
   void setComplementaryFile(KvCIcFileId* file) { complementary = file; }
 
+  // Declares `type` in this file and makes the file the type's module file. `append`: the
+  // type comes after the types defined so far, else before them (for a type that earlier
+  // definitions must be able to use). True also when the type is defined here already
+  // (nothing changes then). False, and nothing changed, for a null type, a type defined
+  // in another file, or when the fixture made the operation fail. `srcRef` is the
+  // caller's and is not kept. O(1) when appending, O(defined types) otherwise.
+  bool defineType(KV_DataType* type, const KvCSrcRef* srcRef, bool append);
+  bool isTypeDefined(const KV_DataType* type) const { return definedSet.count(type) != 0; }
+  // The types defined here, in definition order.
+  const std::vector<KV_DataType*>& getDefinedTypes() const { return definedTypes; }
+  // Fixture switch: while set, defineType answers false and records nothing.
+  void setDefineTypeFails(bool fails) { defineTypeFails = fails; }
+
 private:
+  KvCIcFileId* fileId;
   bool stub = false;
   bool artificial = false;
   tagKvECodegenBase codegenBase = KV_CODEGEN_BASE_MODEL;
   tagKvEFileResponsibility responsibility = KV_FILE_RESPONSIBILITY_GENERATOR;
   KvCCStmTable* table = nullptr;
   KvCIcFileId* complementary = nullptr;
+  std::vector<KV_DataType*> definedTypes;
+  std::unordered_set<const KV_DataType*> definedSet;
+  bool defineTypeFails = false;
 };
 
 #endif

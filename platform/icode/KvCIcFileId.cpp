@@ -5,7 +5,8 @@
 
 #include <algorithm>
 
-KvCIcFileId::KvCIcFileId(int id, WmCXString fileName) : fileNumber(id), name(std::move(fileName)) {}
+KvCIcFileId::KvCIcFileId(int id, WmCXString fileName)
+    : fileNumber(id), name(std::move(fileName)), file(this) {}
 
 KvCIcFileId::~KvCIcFileId() = default;
 

@@ -1,13 +1,17 @@
 // KvCIvData: the root of the intermediate view (the model's partitions and the RTOS
-// database). Declared so that the library can name it; the view's content comes with
-// the subsystems that walk it.
+// database). The partitions come with the subsystems that walk them.
+//
+// It does not own the RTOS database: whoever makes the database (a fixture) keeps it and
+// sets it here; it must outlive every use through this object.
 #ifndef HUL_PLATFORM_VIEW_KVCIVDATA_H
 #define HUL_PLATFORM_VIEW_KVCIVDATA_H
+
+#include "platform/support/HulPlatformExport.h"
 
 class KV_BdPartition;
 class KvCRoDatabase;
 
-class KvCIvData {
+class HUL_PLATFORM_API KvCIvData {
 public:
   KvCIvData() = default;
   KvCIvData(const KvCIvData&) = delete;
@@ -15,8 +19,12 @@ public:
 
   // The root partition of the view; none yet.
   KV_BdPartition* getIvRootPartition() const { return nullptr; }
-  // The RTOS database of the view; none yet.
-  KvCRoDatabase* getRtosDatabase() const { return nullptr; }
+  // The RTOS database of the view, or null when none was set.
+  KvCRoDatabase* getRtosDatabase() const { return rtosDatabase; }
+  void setRtosDatabase(KvCRoDatabase* database) { rtosDatabase = database; }
+
+private:
+  KvCRoDatabase* rtosDatabase = nullptr;
 };
 
 #endif

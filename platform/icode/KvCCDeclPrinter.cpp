@@ -1,0 +1,156 @@
+#include "platform/icode/KvCCDeclPrinter.h"
+
+#include "platform/icode/KV_DataType.h"
+#include "platform/icode/KV_ExprLocation.h"
+#include "platform/icode/KV_Operation.h"
+#include "platform/icode/KV_QualifiedSymbolOp.h"
+#include "platform/icode/KV_Statement.h"
+#include "platform/icode/KvCCStmTable.h"
+#include "platform/icode/KvCIcFileId.h"
+#include "platform/icode/KvCSymbol.h"
+
+#include <cctype>
+
+namespace {
+std::string dimensionSuffix(const KV_DimensionDescriptor& dims) {
+  std::string suffix;
+  for (int i = 0; i < dims.getNumberOfDimensions(); ++i)
+    suffix += "[" + std::to_string(dims.getDimension(i)) + "]";
+  return suffix;
+}
+
+// The declaration specifier and the declarator joined, leading stars on the specifier's
+// side: "void" and "*p" give "void* p", "int" and "(*q)[3]" give "int (*q)[3]".
+std::string join(const std::string& specifier, const std::string& inner) {
+  std::size_t stars = inner.find_first_not_of('*');
+  if (stars == std::string::npos)
+    return specifier + inner;
+  std::string rest = inner.substr(stars);
+  return specifier + inner.substr(0, stars) + " " + rest;
+}
+} // namespace
+
+const char* KvCCDeclPrinter::getCTypeName(int bits, bool isSigned, bool isFloat) {
+  if (isFloat)
+    return bits <= 32 ? "float" : "double";
+  if (bits <= 8)
+    return isSigned ? "signed char" : "unsigned char";
+  if (bits <= 16)
+    return isSigned ? "short" : "unsigned short";
+  if (bits <= 32)
+    return isSigned ? "int" : "unsigned int";
+  return isSigned ? "long long" : "unsigned long long";
+}
+
+WmCXString KvCCDeclPrinter::getIncludeGuard(const WmCXString& fileName) {
+  std::string guard;
+  for (char c : fileName.str()) {
+    auto u = static_cast<unsigned char>(c);
+    guard += std::isalnum(u) ? static_cast<char>(std::toupper(u)) : '_';
+  }
+  if (guard.empty() || !std::isalpha(static_cast<unsigned char>(guard[0])))
+    guard = "FILE_" + guard;
+  return guard;
+}
+
+bool KvCCDeclPrinter::appendsSuffix(const KV_DataType* type) const {
+  for (; type && !isVisible(type); type = type->getBaseType())
+    if (type->getTypeKind() == KV_TYPE_ARRAY || !type->getDimensions().isScalar())
+      return true;
+  return false;
+}
+
+std::string KvCCDeclPrinter::declarator(const KV_DataType* type, std::string inner,
+                                        bool isConst) const {
+  if (type && isVisible(type))
+    return join((isConst ? "const " : "") + type->getName().str(), inner);
+  if (type && type->getBaseType())
+    return declarator(type->getBaseType(), inner + dimensionSuffix(type->getDimensions()), isConst);
+  return structuralDeclarator(type, std::move(inner), isConst);
+}
+
+std::string KvCCDeclPrinter::structuralDeclarator(const KV_DataType* type, std::string inner,
+                                                  bool isConst) const {
+  const std::string qualifier = isConst ? "const " : "";
+  switch (type ? type->getTypeKind() : KV_TYPE_VOID) {
+  case KV_TYPE_NUMERICAL: {
+    const auto* n = static_cast<const KV_NumericalType*>(type);
+    return join(qualifier + getCTypeName(n->getBits(), n->isSigned(), n->isFloat()), inner);
+  }
+  case KV_TYPE_POINTER: {
+    const auto* p = static_cast<const KV_PointerType*>(type);
+    std::string pointer = "*" + (isConst ? "const " + inner : inner);
+    if (appendsSuffix(p->getTargetType()))
+      pointer = "(" + pointer + ")";
+    return declarator(p->getTargetType(), pointer, p->isPointerToConst());
+  }
+  case KV_TYPE_ARRAY: {
+    const auto* a = static_cast<const KV_ArrayType*>(type);
+    return declarator(a->getElementType(), inner + "[" + std::to_string(a->getSize()) + "]",
+                      isConst);
+  }
+  case KV_TYPE_STRUCT:
+    return join(qualifier + "struct " + type->getName().str(), inner);
+  case KV_TYPE_VOID:
+    break;
+  }
+  return join(qualifier + "void", inner);
+}
+
+WmCXString KvCCDeclPrinter::declare(KV_DataType* type, const WmCXString& name) const {
+  return declarator(type, name.str(), false);
+}
+
+WmCXString KvCCDeclPrinter::printTypeDefinition(KV_DataType* type) {
+  if (!type || !type->isCreateTypedef())
+    return {};
+  std::string inner = type->getName().str() + dimensionSuffix(type->getDimensions());
+  std::string definition = type->getBaseType() ? declarator(type->getBaseType(), inner, false)
+                                               : structuralDeclarator(type, inner, false);
+  visible.insert(type);
+  return "typedef " + definition + ";\n";
+}
+
+WmCXString KvCCDeclPrinter::printStatement(const KV_Statement* statement) const {
+  KV_ExprLocation* root = statement ? statement->getExprLoc() : nullptr;
+  KV_Operation* op = root ? root->getOperation() : nullptr;
+  if (!op)
+    return {};
+  switch (op->getOperator()->getKind()) {
+  case KV_OP_VARIABLE_DECLARATION: {
+    // (object, type, file)
+    KV_ExprLocation* object = op->getOperand(0);
+    KvCIcExpression* access = object ? object->getExpression() : nullptr;
+    KV_QualifiedSymbolOp* qso = access ? access->asQualifiedSymbolOp() : nullptr;
+    KvCSymbol* symbol = qso ? qso->getSymbol() : nullptr;
+    if (!symbol)
+      return {};
+    KV_ExprLocation* typeLoc = op->getOperand(1);
+    KV_DataType* type =
+        typeLoc && typeLoc->getDataTypeRef() ? typeLoc->getDataTypeRef() : symbol->getDataType();
+    return "extern " + declare(type, symbol->getName()) + ";\n";
+  }
+  default:
+    return {};
+  }
+}
+
+WmCXString KvCCDeclPrinter::printFile(const KvCIcFileId* file) {
+  if (!file)
+    return {};
+  KvCCDeclPrinter printer;
+  WmCXString guard = getIncludeGuard(file->getName());
+  WmCXString text = "#ifndef " + guard + "\n#define " + guard + "\n";
+  WmCXString typedefs;
+  for (KV_DataType* type : file->getFile()->getDefinedTypes())
+    typedefs += printer.printTypeDefinition(type);
+  if (!typedefs.isEmpty())
+    text += "\n" + typedefs;
+  WmCXString declarations;
+  if (const KvCCStmTable* table = file->getFile()->getStatementTable())
+    for (int i = 0; i < table->getNumberOfStatements(); ++i)
+      declarations += printer.printStatement(table->getStatement(i));
+  if (!declarations.isEmpty())
+    text += "\n" + declarations;
+  return text + "\n#endif\n";
+}
