@@ -3,21 +3,27 @@
 #ifndef HULCVTOOLS_MODELINTERFACES_ICODEFWD_H
 #define HULCVTOOLS_MODELINTERFACES_ICODEFWD_H
 
+class KV_BaseTypeServer;
 class KV_Constant;
 class KV_DataType;
+class KV_DataTypeServer;
+class KV_DimensionDescriptor;
 class KV_ExprLocation;
 class KV_ICodeElem;
 class KV_ICodeElemVisitor;
 class KV_ICodeFactoryContainer;
 class KV_NumericalType;
+class KV_NumericalTypeServer;
 class KV_OpConversionInfo;
 class KV_OpConversionLevel;
 class KV_OpSaturationInfo;
 class KV_OpOperator;
 class KV_Operation;
 class KV_PointerType;
+class KV_PointerTypeServer;
 class KV_QualifiedSymbolOp;
 class KV_Range;
+class KV_ScaleServer;
 class KV_Scaling;
 class KV_Statement;
 class KV_StatementTable;
@@ -34,6 +40,7 @@ class KvCIcExprEqualitySpec;
 class KvCIcExpression;
 class KvCIcFile;
 class KvCIcFileId;
+class KvCIcFileServer;
 class KvCParamSymbol;
 class KvCQsoExprLocDB;
 class KvCSmbInitValExpr;
