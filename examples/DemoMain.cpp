@@ -44,6 +44,7 @@ int main(int argc, char** argv) {
     demoExprLocDB(run);
     demoCallGraph(run);
     demoFixedPoint(run);
+    demoRtos(run);
   }
 
   printSectionTitle(out, "Shutdown");

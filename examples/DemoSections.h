@@ -33,5 +33,7 @@ void demoExprLocDB(DemoRun& run);
 void demoCallGraph(DemoRun& run);
 // Constants in relations scaled and rounded; absolute values.
 void demoFixedPoint(DemoRun& run);
+// The RTOS types of multirate code and the OSEK header that declares them.
+void demoRtos(DemoRun& run);
 
 #endif

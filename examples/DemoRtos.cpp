@@ -1,0 +1,82 @@
+// RTOS servers: for a sample RTOS description, every RTOS type is made once and declared
+// in the OSEK header (ISRDummyType in the Acme header); the model's printer shows the
+// header a C compiler would get.
+#include "DemoSampleApp.h"
+#include "DemoSections.h"
+
+#include "HulCvTools/MultirateCodegenTools/KvCMcgTypeServer.h"
+#include "platform/icode/KV_DataType.h"
+#include "platform/icode/KvCCDeclPrinter.h"
+#include "platform/icode/KvCCodeViewData.h"
+#include "platform/icode/KvCIcFile.h"
+#include "platform/icode/KvCIcFileId.h"
+#include "platform/view/KvCRoDataTypes.h"
+#include "platform/view/KvCRoDatabase.h"
+#include "platform/view/KvCRoRTOSInfo.h"
+
+namespace {
+
+void describeRtos(KvCRoDatabase& rtos) {
+  KvCRoRTOSInfo* info = rtos.demandRTOSInfo();
+  info->setOSName("SampleOS");
+  KvCRoDataTypes* types = info->getDataTypes();
+  types->setStatusType("UInt8", "status of an API call");
+  types->setTaskType("UInt8", "task identifier");
+  types->setEventMaskType("UInt32", "event mask");
+  types->setSymbolicName("UInt16", "symbolic name of a message");
+  types->setResourceType("UInt8", "resource identifier");
+  types->setAlarmType("UInt8", "alarm identifier");
+  types->setTickType("UInt32", "counter ticks");
+  types->setAccessNameRefDescription("reference to message data");
+  types->setKvCounterTypeBaseType("UInt16");
+}
+
+} // namespace
+
+void demoRtos(DemoRun& run) {
+  printSectionTitle(run.out, "RTOS types for multirate code");
+  KvCCodeViewData& data = run.sample.app.data();
+  KvCRoDatabase rtos(&data);
+  describeRtos(rtos);
+  KvCRoDatabase* previous = data.getRtosDatabase();
+  data.setRtosDatabase(&rtos);
+
+  KvCMcgTypeServer types;
+  types.bootPhaseOne(&data, data.getFactoryContainer(), &rtos, true);
+  if (!types.bootPhaseTwo()) {
+    run.out << "  the type server could not boot\n";
+    data.setRtosDatabase(previous);
+    return;
+  }
+  using Demand = KV_DataType* (KvCMcgTypeServer::*)(const KvCSrcRef*);
+  const Demand demands[] = {
+      &KvCMcgTypeServer::demandStatusType,       &KvCMcgTypeServer::demandTaskType,
+      &KvCMcgTypeServer::demandEventMaskType,    &KvCMcgTypeServer::demandEventMaskRefType,
+      &KvCMcgTypeServer::demandSymbolicNameType, &KvCMcgTypeServer::demandAccessNameRefType,
+      &KvCMcgTypeServer::demandResourceType,     &KvCMcgTypeServer::demandAlarmType,
+      &KvCMcgTypeServer::demandTickType,         &KvCMcgTypeServer::demandISRDummyType};
+  run.out << "  " << rtos.demandRTOSInfo()->getOSName().str() << " types:";
+  for (Demand demand : demands) {
+    KV_DataType* type = (types.*demand)(nullptr);
+    run.out << " " << (type ? type->getName().str() : std::string("(none)"));
+  }
+  KV_DataType* counterId = types.demandCounterIDType();
+  run.out << "\n  counter identifiers are " << (counterId ? counterId->getName().str() : "(none)")
+          << "\n  the OSEK header as printed:\n";
+  KvCIcFile* header = nullptr;
+  if (rtos.demandOsekHFile(header, nullptr) && header) {
+    const std::string text = KvCCDeclPrinter::printFile(header->getFileId()).str();
+    std::size_t start = 0;
+    while (start < text.size()) {
+      const std::size_t end = text.find('\n', start);
+      const std::string line = text.substr(start, end == std::string::npos ? end : end - start);
+      if (!line.empty())
+        run.out << "    " << line << "\n";
+      if (end == std::string::npos)
+        break;
+      start = end + 1;
+    }
+  }
+  types.shutdown();
+  data.setRtosDatabase(previous);
+}
