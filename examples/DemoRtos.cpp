@@ -1,17 +1,24 @@
 // RTOS servers: for a sample RTOS description, every RTOS type is made once and declared
-// in the OSEK header (ISRDummyType in the Acme header); the model's printer shows the
-// header a C compiler would get.
+// in the OSEK header (ISRDummyType in the Acme header), and the identifier variables of a
+// few RTOS objects join them there; the model's printer shows the header a C compiler
+// would get.
 #include "DemoSampleApp.h"
 #include "DemoSections.h"
 
+#include "HulCvTools/MultirateCodegenTools/KvCMcgSymbolServer.h"
 #include "HulCvTools/MultirateCodegenTools/KvCMcgTypeServer.h"
+#include "platform/icode/KV_ExprDescrTupel.h"
+#include "platform/icode/KV_ICodeFactoryContainer.h"
 #include "platform/icode/KV_DataType.h"
 #include "platform/icode/KvCCDeclPrinter.h"
 #include "platform/icode/KvCCodeViewData.h"
 #include "platform/icode/KvCIcFile.h"
 #include "platform/icode/KvCIcFileId.h"
+#include "platform/view/KvCIvData.h"
+#include "platform/view/KvCRoAlarm.h"
 #include "platform/view/KvCRoDataTypes.h"
 #include "platform/view/KvCRoDatabase.h"
+#include "platform/view/KvCRoEvent.h"
 #include "platform/view/KvCRoRTOSInfo.h"
 
 namespace {
@@ -61,8 +68,26 @@ void demoRtos(DemoRun& run) {
     run.out << " " << (type ? type->getName().str() : std::string("(none)"));
   }
   KV_DataType* counterId = types.demandCounterIDType();
-  run.out << "\n  counter identifiers are " << (counterId ? counterId->getName().str() : "(none)")
-          << "\n  the OSEK header as printed:\n";
+  run.out << "\n  counter identifiers are " << (counterId ? counterId->getName().str() : "(none)");
+
+  // Identifier variables of an alarm and an event: made once, kept by the objects.
+  KvCIvData view;
+  KV_ICodeFactoryContainer* factories = data.getFactoryContainer();
+  KvCMcgSymbolServer symbols;
+  symbols.bootPhaseOne(factories->getMacroSymbolServer(), &types, factories->getVarClassServer(),
+                       &data, factories, &view, factories->getCgsSupporter(), true, &rtos);
+  if (symbols.bootPhaseTwo()) {
+    KvCRoAlarm* alarm = rtos.createAlarm("Alarm_10ms");
+    KvCRoEvent* event = rtos.createEvent("Ev_DataReady");
+    KV_ExprDescrTupel* alarmId = symbols.demandAlarmIdVariable(alarm, nullptr);
+    KV_ExprDescrTupel* eventId = symbols.demandEventIdVariable(event, nullptr);
+    run.out << "\n  identifier variables: "
+            << (alarmId ? alarmId->getSymbol()->getName().str() : "(none)") << ", "
+            << (eventId ? eventId->getSymbol()->getName().str() : "(none)")
+            << (symbols.demandAlarmIdVariable(alarm, nullptr) == alarmId ? " (found again)" : "");
+    symbols.shutdown();
+  }
+  run.out << "\n  the OSEK header as printed:\n";
   KvCIcFile* header = nullptr;
   if (rtos.demandOsekHFile(header, nullptr) && header) {
     const std::string text = KvCCDeclPrinter::printFile(header->getFileId()).str();

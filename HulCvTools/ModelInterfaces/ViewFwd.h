@@ -6,8 +6,13 @@
 class KV_BdPartition;
 class KvCCbActualInterface;
 class KvCIvData;
+class KvCRoAlarm;
+class KvCRoCounter;
 class KvCRoDatabase;
 class KvCRoDataTypes;
+class KvCRoEvent;
+class KvCRoMessage;
 class KvCRoRTOSInfo;
+class KvCRoResource;
 
 #endif

@@ -3,6 +3,7 @@
 #define HULCVTOOLS_MODELINTERFACES_VIEWMODEL_H
 
 #include "HulCvTools/ModelInterfaces/ViewFwd.h"
+#include "platform/view/KV_BdPartition.h"
 #include "platform/view/KvCIvData.h"
 #include "platform/view/KvCRoAlarm.h"
 #include "platform/view/KvCRoCounter.h"

@@ -15,6 +15,8 @@ public:
   KV_BaseTypeServer& operator=(const KV_BaseTypeServer&) = delete;
 
   KV_NumericalType* getInt8() { return types->getInt8(); }
+  // The void type of the run.
+  KV_DataType* getVoid() { return types->demandVoidType(); }
   // The base type of that name; null for a null name or one that names no base type.
   KV_DataType* getBase(const WmCXString* name) {
     return name ? types->demandBaseType(*name) : nullptr;

@@ -11,6 +11,7 @@
 
 class KvCCodeViewData;
 class KvCIcFileId;
+class KvCSrcRef;
 class KvCSmbInitValExpr;
 class KvCStringExpr;
 class KvCSymbol;
@@ -31,6 +32,13 @@ public:
   KV_ExprLocation* createFromString(const WmCXString& text, bool asCode, bool quoted);
   KV_ExprLocation* createFromDataType(KV_DataType* type);
   KV_ExprLocation* createFromFileId(KvCIcFileId* file);
+  // Forms that take the caller's source reference (not kept). createFromName: a location
+  // holding the name as code text (an identifier the generated code names), cooked to a
+  // valid C identifier with `cook`; null for an empty name. createFromValue: an untyped
+  // signed integer constant. createFromOperation: as above.
+  KV_ExprLocation* createFromName(const WmCXString& name, bool cook, const KvCSrcRef* srcRef);
+  KV_ExprLocation* createFromValue(std::int64_t value, const KvCSrcRef* srcRef);
+  KV_ExprLocation* createFromOperation(KV_Operation* op, const KvCSrcRef* srcRef);
 
   KV_Constant* createConstant(tagKvEConstantType type, std::int64_t value, KV_DataType* dt);
   KV_Constant* createDoubleConstant(double value, KV_DataType* dt);

@@ -16,7 +16,9 @@
 #include <memory>
 
 KV_ICodeFactoryContainer::KV_ICodeFactoryContainer(KvCCodeViewData* owner)
-    : codeViewData(owner), locations(owner), operations(owner), qsos(owner), statements(owner) {}
+    : codeViewData(owner), locations(owner), operations(owner), qsos(owner), statements(owner),
+      qsoFactories(owner),
+      cgsSupporter(owner), macroSymbols(&cgsSupporter, &varClasses) {}
 
 KV_DataTypeServer* KV_ICodeFactoryContainer::getDataTypeServer() const {
   return codeViewData->getDataTypeServer();
@@ -34,6 +36,12 @@ KvCIcFileServer* KV_ICodeFactoryContainer::getFileServer() const {
   return codeViewData->getFileServer();
 }
 KV_SymbolDB* KV_ICodeFactoryContainer::getSymbolDB() const { return codeViewData->getSymbolDB(); }
+KV_SymbolServer* KV_ICodeFactoryContainer::getSymbolServer() const {
+  return codeViewData->getSymbolServer();
+}
+KvCSmbClassServer* KV_ICodeFactoryContainer::getSmbClassServer() const {
+  return codeViewData->getSmbClassServer();
+}
 
 // --- locations and what they hold
 

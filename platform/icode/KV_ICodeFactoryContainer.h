@@ -3,15 +3,21 @@
 #ifndef HUL_PLATFORM_ICODE_KV_ICODEFACTORYCONTAINER_H
 #define HUL_PLATFORM_ICODE_KV_ICODEFACTORYCONTAINER_H
 
+#include "platform/icode/KV_CgsSupporter.h"
 #include "platform/icode/KV_ExprLocFactory.h"
+#include "platform/icode/KV_MacroSymbolServer.h"
 #include "platform/icode/KV_OperationFactory.h"
+#include "platform/icode/KV_QSOFactories.h"
 #include "platform/icode/KV_QSOFactory.h"
 #include "platform/icode/KV_StatementFactory.h"
+#include "platform/icode/KvCVarClassServer.h"
 
 class KV_BaseTypeServer;
 class KV_DataTypeServer;
 class KV_NumericalTypeServer;
 class KV_ScaleServer;
+class KV_SymbolServer;
+class KvCSmbClassServer;
 class KV_SymbolDB;
 class KvCIcFileServer;
 
@@ -31,6 +37,15 @@ public:
   KV_ScaleServer* getScalingServer() const;
   KvCIcFileServer* getFileServer() const;
   KV_SymbolDB* getSymbolDB() const;
+  // The servers of variable classes and extern globals, and the code generation support.
+  KvCVarClassServer* getVarClassServer() { return &varClasses; }
+  KV_MacroSymbolServer* getMacroSymbolServer() { return &macroSymbols; }
+  KV_CgsSupporter* getCgsSupporter() { return &cgsSupporter; }
+  // The symbol servers (function symbols), the symbol class server and the reference
+  // factory; the symbol and symbol class servers are the code view data's.
+  KV_SymbolServer* getSymbolServer() const;
+  KvCSmbClassServer* getSmbClassServer() const;
+  KV_QSOFactories* getQSOFactories() { return &qsoFactories; }
 
 private:
   KvCCodeViewData* codeViewData;
@@ -38,6 +53,10 @@ private:
   KV_OperationFactory operations;
   KV_QSOFactory qsos;
   KV_StatementFactory statements;
+  KV_QSOFactories qsoFactories;
+  KvCVarClassServer varClasses;
+  KV_CgsSupporter cgsSupporter;
+  KV_MacroSymbolServer macroSymbols; // after the two it uses
 };
 
 #endif

@@ -38,6 +38,11 @@ KV_PointerType* KV_PointerTypeServer::getScalarPointer(KV_DataType* type, WmCXSt
   return getNonDDMappedPointer(*name, text, scalar, createTypedef, pointer, srcRef);
 }
 
+KV_PointerType* KV_PointerTypeServer::getScalarPointer(KV_DataType* type,
+                                                       const KvCSrcRef* /*srcRef*/) {
+  return types->demandPointerType(type, false);
+}
+
 KV_PointerType* KV_PointerTypeServer::getVoidPointer() {
   return types->demandPointerType(types->demandVoidType(), false);
 }

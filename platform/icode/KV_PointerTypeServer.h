@@ -36,6 +36,9 @@ public:
   KV_PointerType* getScalarPointer(KV_DataType* type, WmCXString* name, bool toConst,
                                    bool createTypedef, const WmCXString* description,
                                    const KvCSrcRef* srcRef);
+  // The unnamed pointer to `type` (not to const); null for a null type. `srcRef` is the
+  // caller's and is not kept.
+  KV_PointerType* getScalarPointer(KV_DataType* type, const KvCSrcRef* srcRef);
   // The unnamed pointer to void.
   KV_PointerType* getVoidPointer();
 

@@ -21,8 +21,16 @@ public:
   }
   // LSB 1, offset 0.
   KV_Scaling* getIdentityScaling() { return demandScaling(1.0, 0.0); }
+  // The special scalings (see KV_Scaling): one object each for the run, distinct from
+  // every fixed scaling and from each other.
+  KV_Scaling* getAdaptiveScaling() { return &adaptive; }
+  KV_Scaling* getDefaultScaling() { return &defaultScaling; }
+  KV_Scaling* getDefaultVoidScaling() { return &defaultVoid; }
 
 private:
+  KV_Scaling adaptive{1.0, 0.0, KV_SCALING_ADAPTIVE};
+  KV_Scaling defaultScaling{1.0, 0.0, KV_SCALING_DEFAULT};
+  KV_Scaling defaultVoid{1.0, 0.0, KV_SCALING_DEFAULT_VOID};
   std::map<std::pair<double, double>, std::unique_ptr<KV_Scaling>> scalings;
 };
 

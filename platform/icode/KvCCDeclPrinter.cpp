@@ -7,6 +7,7 @@
 #include "platform/icode/KV_Statement.h"
 #include "platform/icode/KvCCStmTable.h"
 #include "platform/icode/KvCIcFileId.h"
+#include "platform/icode/KvCParamSymbol.h"
 #include "platform/icode/KvCSymbol.h"
 
 #include <cctype>
@@ -130,9 +131,33 @@ WmCXString KvCCDeclPrinter::printStatement(const KV_Statement* statement) const 
         typeLoc && typeLoc->getDataTypeRef() ? typeLoc->getDataTypeRef() : symbol->getDataType();
     return "extern " + declare(type, symbol->getName()) + ";\n";
   }
+  case KV_OP_FUNCTION_DECLARATION:
+    return printPrototype(op);
   default:
     return {};
   }
+}
+
+WmCXString KvCCDeclPrinter::printPrototype(const KV_Operation* declaration) const {
+  // (function, return type, file)
+  KV_ExprLocation* object = declaration->getOperand(0);
+  KvCIcExpression* access = object ? object->getExpression() : nullptr;
+  KV_QualifiedSymbolOp* qso = access ? access->asQualifiedSymbolOp() : nullptr;
+  KvCSymbol* symbol = qso ? qso->getSymbol() : nullptr;
+  KvCParamSymbol* function = symbol ? symbol->asParamSymbol() : nullptr;
+  if (!function || function->isMacro() || !function->hasSignature())
+    return {};
+  std::string parameters;
+  for (int i = 0; i < function->getNumberOfFormalParams(); ++i) {
+    const KvCParamSymbol::FormalParam& param = function->getFormalParam(i);
+    if (i > 0)
+      parameters += ", ";
+    parameters += declarator(param.type, param.name.str(), false);
+  }
+  if (parameters.empty())
+    parameters = "void";
+  const std::string inner = function->getName().str() + "(" + parameters + ")";
+  return declarator(function->getDataType(), inner, false) + ";\n";
 }
 
 WmCXString KvCCDeclPrinter::printFile(const KvCIcFileId* file) {

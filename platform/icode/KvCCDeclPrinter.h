@@ -1,8 +1,10 @@
 // KvCCDeclPrinter: writes what a file of the ICode declares as C99 text: an include guard,
 // the typedefs of the types the file defines (in definition order) and the declarations
-// its top-level statement table holds. Today these are the variable declarations
-// (`extern StatusType status;`); function prototypes and macros follow when the model
-// carries their parameters and bodies (printStatement is where they go).
+// its top-level statement table holds: the variable declarations
+// (`extern StatusType status;`) and the prototypes of the functions declared there that
+// carry a signature (`StatusType SetEvent(TaskType taskId, EventMaskType mask);`, `void
+// Schedule(void);`). Functions without a signature (made other than by the function symbol
+// server or the call inserter) and macros print nothing yet.
 //
 // Every printed file is valid C99 on its own: it includes nothing. A type is written by
 // its name only where the name is visible, that is after its typedef in the same file;
@@ -22,6 +24,7 @@
 #include <unordered_set>
 
 class KV_DataType;
+class KV_Operation;
 class KV_Statement;
 class KvCIcFileId;
 
@@ -49,6 +52,8 @@ public:
   WmCXString printStatement(const KV_Statement* statement) const;
 
 private:
+  // The prototype of a function declaration; empty when it has no signature.
+  WmCXString printPrototype(const KV_Operation* declaration) const;
   bool isVisible(const KV_DataType* type) const { return visible.count(type) != 0; }
   // The declarator of `type` around `inner`; `isConst` qualifies the declared object.
   std::string declarator(const KV_DataType* type, std::string inner, bool isConst) const;

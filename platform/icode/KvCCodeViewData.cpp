@@ -7,13 +7,17 @@
 #include "platform/icode/KV_NumericalTypeServer.h"
 #include "platform/icode/KV_ScaleServer.h"
 #include "platform/icode/KV_SymbolDB.h"
+#include "platform/icode/KV_SymbolServer.h"
+#include "platform/icode/KvCApplicationServer.h"
 #include "platform/icode/KvCExprLocDB.h"
 #include "platform/icode/KvCExprLocDBServer.h"
 #include "platform/icode/KvCIcApplication.h"
 #include "platform/icode/KvCIcFileServer.h"
 #include "platform/icode/KvCRtosProtection.h"
+#include "platform/icode/KvCSmbClassServer.h"
 #include "platform/icode/KvCSymbol.h"
 #include "platform/icode/KvCTaskActivation.h"
+#include "platform/icode/KvCTemplateServer.h"
 #include "platform/support/KvCNameSpace.h"
 #include "platform/support/KvCSrcRefServer.h"
 
@@ -42,7 +46,11 @@ KvCCodeViewData::KvCCodeViewData(const WmCXString& applicationName)
       fileServer(std::make_unique<KvCIcFileServer>(this)),
       symbolDB(std::make_unique<KV_SymbolDB>()),
       dbServer(std::make_unique<KvCExprLocDBServer>(this)),
-      factories(std::make_unique<KV_ICodeFactoryContainer>(this)) {
+      factories(std::make_unique<KV_ICodeFactoryContainer>(this)),
+      symbolServer(std::make_unique<KV_SymbolServer>(this)),
+      smbClassServer(std::make_unique<KvCSmbClassServer>()),
+      templateServer(std::make_unique<KvCTemplateServer>()),
+      applServer(std::make_unique<KvCApplicationServer>(this)) {
   for (int l = 0; l < KV_CONV_NUMBER_OF_LEVELS; ++l)
     levels[l] = std::make_unique<KV_OpConversionLevel>(static_cast<tagKvEConversionLevel>(l));
   liveCodeViewData().push_back(this);

@@ -25,6 +25,10 @@ class KV_ICodeFactoryContainer;
 class KV_NumericalTypeServer;
 class KV_ScaleServer;
 class KV_SymbolDB;
+class KV_SymbolServer;
+class KvCApplicationServer;
+class KvCSmbClassServer;
+class KvCTemplateServer;
 class KvCExprLocDBServer;
 class KvCIcApplication;
 class KvCIcCodeUnit;
@@ -59,6 +63,10 @@ public:
   KV_ScaleServer* getScalingServer() const { return scalingServer.get(); }
   KvCIcFileServer* getFileServer() const { return fileServer.get(); }
   KV_ICodeFactoryContainer* getFactoryContainer() const { return factories.get(); }
+  KV_SymbolServer* getSymbolServer() const { return symbolServer.get(); }
+  KvCSmbClassServer* getSmbClassServer() const { return smbClassServer.get(); }
+  KvCTemplateServer* getTemplateServer() const { return templateServer.get(); }
+  KvCApplicationServer* getApplServer() const { return applServer.get(); }
   KV_OpConversionLevel* getConversionLevel(tagKvEConversionLevel level) const;
 
   // The RTOS database of the run, or null when none was set. Not owned: whoever makes the
@@ -111,6 +119,10 @@ private:
   std::unique_ptr<KV_SymbolDB> symbolDB;
   std::unique_ptr<KvCExprLocDBServer> dbServer;
   std::unique_ptr<KV_ICodeFactoryContainer> factories;
+  std::unique_ptr<KV_SymbolServer> symbolServer;
+  std::unique_ptr<KvCSmbClassServer> smbClassServer;
+  std::unique_ptr<KvCTemplateServer> templateServer;
+  std::unique_ptr<KvCApplicationServer> applServer;
   KvCRoDatabase* rtosDatabase = nullptr;
 };
 

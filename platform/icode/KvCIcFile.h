@@ -46,6 +46,8 @@ public:
   tagKvEFileResponsibility getResponsibility() const { return responsibility; }
   void setResponsibility(tagKvEFileResponsibility r) { responsibility = r; }
   KvCCStmTable* getStatementTable() const { return table; }
+  // The top-level statement table (the same as getStatementTable).
+  KvCCStmTable* getStt() const { return table; }
   void setStatementTable(KvCCStmTable* t) { table = t; }
   KvCIcFileId* getComplementaryFile() const { return complementary; }
   void setComplementaryFile(KvCIcFileId* file) { complementary = file; }
@@ -63,6 +65,19 @@ public:
   // Fixture switch: while set, defineType answers false and records nothing.
   void setDefineTypeFails(bool fails) { defineTypeFails = fails; }
 
+  // Emit marks. Force-emit: the user asked that the file be written even if the code
+  // generator would leave it out. Do-not-emit because of a special function template: the
+  // file belongs to a user function template, so the code generator writes nothing into
+  // it. The marks are independent; setting one does not clear the other.
+  bool isMarkedAsForceEmit() const { return forceEmit; }
+  void markAsForceEmit() { forceEmit = true; }
+  bool isMarkedAsDoNotEmitCauseSpecialFunctionTempl() const { return doNotEmitSpecialTempl; }
+  void markAsDoNotEmitCauseSpecialFunctionTempl() { doNotEmitSpecialTempl = true; }
+
+  // Where the file was asked for, or null. Not owned.
+  const KvCSrcRef* getSourceRef() const { return sourceRef; }
+  void setSourceRef(const KvCSrcRef* ref) { sourceRef = ref; }
+
 private:
   KvCIcFileId* fileId;
   bool stub = false;
@@ -74,6 +89,9 @@ private:
   std::vector<KV_DataType*> definedTypes;
   std::unordered_set<const KV_DataType*> definedSet;
   bool defineTypeFails = false;
+  bool forceEmit = false;
+  bool doNotEmitSpecialTempl = false;
+  const KvCSrcRef* sourceRef = nullptr;
 };
 
 #endif

@@ -36,6 +36,10 @@ enum tagKvESymbolRole : unsigned {
   KV_ROLE_REFERENCE_FORMAL = 1u << 13,
   KV_ROLE_FORMAL_PARAMETER = 1u << 14,
   KV_ROLE_TASK_FUNCTION = 1u << 15,
+  KV_ROLE_TERMINATE_TASK = 1u << 16,
+  KV_ROLE_SET_ABS_ALARM = 1u << 17,
+  KV_ROLE_SET_REL_ALARM = 1u << 18,
+  KV_ROLE_CANCEL_ALARM = 1u << 19,
 };
 
 class HUL_PLATFORM_API KvCSymbol {
@@ -70,6 +74,15 @@ public:
   bool isRtosScheduleFcn() const { return hasRole(KV_ROLE_RTOS_SCHEDULE_FCN); }
   void markAsSideEffectFreeFunction() { setRole(KV_ROLE_SIDE_EFFECT_FREE, true); }
   void markAsRtosScheduleFcn() { setRole(KV_ROLE_RTOS_SCHEDULE_FCN, true); }
+  // The RTOS API functions that end a task and that set or cancel an alarm.
+  bool isTerminateTaskSymbol() const { return hasRole(KV_ROLE_TERMINATE_TASK); }
+  bool isSetAbsAlarmFunction() const { return hasRole(KV_ROLE_SET_ABS_ALARM); }
+  bool isSetRelAlarmFunction() const { return hasRole(KV_ROLE_SET_REL_ALARM); }
+  bool isCancelAlarmFunction() const { return hasRole(KV_ROLE_CANCEL_ALARM); }
+  void markAsTerminateTaskSymbol() { setRole(KV_ROLE_TERMINATE_TASK, true); }
+  void markAsSetAbsAlarmFunction() { setRole(KV_ROLE_SET_ABS_ALARM, true); }
+  void markAsSetRelAlarmFunction() { setRole(KV_ROLE_SET_REL_ALARM, true); }
+  void markAsCancelAlarmFunction() { setRole(KV_ROLE_CANCEL_ALARM, true); }
 
 protected:
   KvCSymbol(int index, WmCXString symbolName, KV_DataType* type);

@@ -4,6 +4,8 @@
 
 #include "platform/icode/KvCSymbol.h"
 
+class KvCVarClassId;
+
 class HUL_PLATFORM_API KvCUnparamSymbol : public KvCSymbol {
 public:
   KvCUnparamSymbol(int index, WmCXString symbolName, KV_DataType* type, bool component)
@@ -17,9 +19,14 @@ public:
   // A formal parameter through which the actual argument is passed by reference: the
   // formal aliases the caller's object, so it never stands for a copy of the actual.
   bool isReferenceFormal() const { return hasRole(KV_ROLE_REFERENCE_FORMAL); }
+  // The variable class the variable was made with, or null (not owned; the variable
+  // class server owns it).
+  KvCVarClassId* getVarClass() const { return varClass; }
+  void setVarClass(KvCVarClassId* cls) { varClass = cls; }
 
 private:
   bool isComponentSymbol;
+  KvCVarClassId* varClass = nullptr;
 };
 
 #endif

@@ -21,6 +21,9 @@ public:
 
   const WmCXString& getRawName() const { return rawName; }
   WmCXString getCookedName() const;
+  // The cooked name for a kind of name (0: the name of a symbol); every kind is cooked
+  // alike here.
+  WmCXString getCookedName(int /*nameType*/) const { return getCookedName(); }
 
   // The reference is not owned; it must outlive this identifier's use.
   void setSourceRef(const KvCSrcRef* ref) { srcRef = ref; }
