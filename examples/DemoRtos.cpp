@@ -5,11 +5,12 @@
 #include "DemoSampleApp.h"
 #include "DemoSections.h"
 
+#include "HulCvTools/MultirateCodegenTools/KvCMcgFunctionServer.h"
 #include "HulCvTools/MultirateCodegenTools/KvCMcgSymbolServer.h"
 #include "HulCvTools/MultirateCodegenTools/KvCMcgTypeServer.h"
+#include "platform/icode/KV_DataType.h"
 #include "platform/icode/KV_ExprDescrTupel.h"
 #include "platform/icode/KV_ICodeFactoryContainer.h"
-#include "platform/icode/KV_DataType.h"
 #include "platform/icode/KvCCDeclPrinter.h"
 #include "platform/icode/KvCCodeViewData.h"
 #include "platform/icode/KvCIcFile.h"
@@ -20,6 +21,8 @@
 #include "platform/view/KvCRoDatabase.h"
 #include "platform/view/KvCRoEvent.h"
 #include "platform/view/KvCRoRTOSInfo.h"
+
+#include <iterator>
 
 namespace {
 
@@ -86,6 +89,28 @@ void demoRtos(DemoRun& run) {
             << (eventId ? eventId->getSymbol()->getName().str() : "(none)")
             << (symbols.demandAlarmIdVariable(alarm, nullptr) == alarmId ? " (found again)" : "");
     symbols.shutdown();
+  }
+  // The OSEK API: every function made once, with its signature, in the OSEK header.
+  KvCMcgFunctionServer functions;
+  functions.bootPhaseOne(&data, factories, &types, &rtos, true);
+  if (functions.bootPhaseTwo()) {
+    using FunctionDemand = KvCParamSymbol* (KvCMcgFunctionServer::*)(const KvCSrcRef*);
+    const FunctionDemand api[] = {&KvCMcgFunctionServer::demandOsekApiActivateTask,
+                                  &KvCMcgFunctionServer::demandOsekApiTerminateTask,
+                                  &KvCMcgFunctionServer::demandOsekApiSetEvent,
+                                  &KvCMcgFunctionServer::demandOsekApiWaitEvent,
+                                  &KvCMcgFunctionServer::demandOsekApiGetResource,
+                                  &KvCMcgFunctionServer::demandOsekApiReleaseResource,
+                                  &KvCMcgFunctionServer::demandOsekApiSetRelAlarm,
+                                  &KvCMcgFunctionServer::demandOsekApiSchedule};
+    int made = 0;
+    for (FunctionDemand demand : api)
+      made += (functions.*demand)(nullptr) != nullptr ? 1 : 0;
+    run.out << "\n  OSEK API functions made: " << made << " of " << std::size(api)
+            << (functions.demandOsekApiSetEvent(nullptr) == functions.demandOsekApiSetEvent(nullptr)
+                    ? " (each once)"
+                    : "");
+    functions.shutdown();
   }
   run.out << "\n  the OSEK header as printed:\n";
   KvCIcFile* header = nullptr;
