@@ -1,5 +1,6 @@
 #include "platform/icode/KV_FunctionSymbolServer.h"
 
+#include "platform/icode/KV_DataTypeServer.h"
 #include "platform/icode/KV_ExprLocation.h"
 #include "platform/icode/KV_ICodeFactoryContainer.h"
 #include "platform/icode/KV_Operation.h"
@@ -8,14 +9,14 @@
 #include "platform/icode/KvCCStmTable.h"
 #include "platform/icode/KvCCodeViewData.h"
 #include "platform/icode/KvCParamSymbol.h"
+#include "platform/support/KvCNameSpace.h"
 
 #include <vector>
 
 namespace {
 bool agrees(const KvCParamSymbol* existing, KV_DataType* returnType,
             const leda::array<KV_DataType*>& types) {
-  if (existing->getDataType() != returnType ||
-      existing->getNumberOfFormalParams() != types.size())
+  if (existing->getDataType() != returnType || existing->getNumberOfFormalParams() != types.size())
     return false;
   for (int i = 0; i < types.size(); ++i)
     if (existing->getFormalParam(i).type != types[types.low() + i])
@@ -40,9 +41,9 @@ void declare(KvCCodeViewData* cvd, KvCCStmTable* table, KvCParamSymbol* fn) {
 
 KvCParamSymbol* KV_FunctionSymbolServer::demand(
     KvCCStmTable* table, const WmCXString& name, unsigned int flags, KV_DataType* returnType,
-    KV_Scaling* returnScaling, leda::array<KV_DataType*>& types,
-    leda::array<KV_Scaling*>& scalings, leda::array<WmCXString>& names, unsigned int* paramFlags,
-    KvCFcnClassId* fcnClass, bool* newlyCreated, const KvCSrcRef* /*srcRef*/) {
+    KV_Scaling* returnScaling, leda::array<KV_DataType*>& types, leda::array<KV_Scaling*>& scalings,
+    leda::array<WmCXString>& names, unsigned int* paramFlags, KvCFcnClassId* fcnClass,
+    bool* newlyCreated, const KvCSrcRef* /*srcRef*/) {
   ++demands;
   if (newlyCreated)
     *newlyCreated = false;
@@ -60,6 +61,11 @@ KvCParamSymbol* KV_FunctionSymbolServer::demand(
   auto it = functions.find(key);
   if (it != functions.end())
     return agrees(it->second, returnType, types) ? it->second : nullptr;
+  // A name a variable of the file's scope, or a type, already carries cannot name a
+  // function as well: the file would not be C.
+  if ((table->getNameSpace() && table->getNameSpace()->contains(name)) ||
+      codeViewData->getDataTypeServer()->findType(name))
+    return nullptr;
   KvCParamSymbol* fn = codeViewData->getSymbolDB()->createParamSymbol(name, returnType, false);
   fn->setScaling(returnScaling);
   fn->setSignature(flags, fcnClass, std::move(params));

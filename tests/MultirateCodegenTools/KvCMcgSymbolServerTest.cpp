@@ -3,6 +3,7 @@
 // found again by name, the OSEK header may arrive late, names that cannot be had are
 // reported without leaving half-made variables, and the printed headers compile.
 #include "HulCvTools/MultirateCodegenTools/KvCMcgSymbolServer.h"
+#include "HulCvTools/MultirateCodegenTools/KvCMcgFunctionServer.h"
 #include "HulCvTools/MultirateCodegenTools/KvCMcgTypeServer.h"
 #include "platform/builder/AppBuilder.h"
 #include "platform/icode/KV_ExprDescrTupel.h"
@@ -350,6 +351,28 @@ TEST_F(McgSymbolServerTest, PrintedHeadersCompileWithEveryVariable) {
   EXPECT_EQ(std::system(command.c_str()), 0) << command;
   std::error_code ignored;
   fs::remove_all(path, ignored);
+}
+
+} // namespace
+
+namespace {
+
+// An RTOS object named like an API function: its identifier variable takes the name
+// first, so the function cannot be declared beside it; the function server reports that
+// instead of leaving a header that is not C.
+TEST_F(McgSymbolServerTest, ApiFunctionNamedLikeAnIdentifierVariableIsRefused) {
+  ASSERT_TRUE(boot());
+  KvCMcgFunctionServer functions;
+  functions.bootPhaseOne(&app.data(), container(), &types, &rtos, true);
+  ASSERT_TRUE(functions.bootPhaseTwo());
+  ASSERT_NE(server.demandAlarmIdVariable(rtos.createAlarm("Schedule"), nullptr), nullptr);
+  messages().clear();
+  EXPECT_EQ(functions.demandOsekApiSchedule(nullptr), nullptr);
+  bool checked = false;
+  for (const std::string& text : messageTexts())
+    checked = checked || text.find("KvCMcgFunctionServer 2403") != std::string::npos;
+  EXPECT_TRUE(checked);
+  EXPECT_NE(functions.demandOsekApiActivateTask(nullptr), nullptr) << "other names are free";
 }
 
 } // namespace
