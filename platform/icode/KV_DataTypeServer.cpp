@@ -1,5 +1,7 @@
 #include "platform/icode/KV_DataTypeServer.h"
 
+#include "platform/icode/KV_SymbolDB.h"
+
 #include "platform/icode/KV_PointerTypeServer.h"
 
 KV_DataTypeServer::KV_DataTypeServer()
@@ -15,7 +17,7 @@ template <class T> T* KV_DataTypeServer::adopt(std::unique_ptr<T> type) {
 
 template <class T>
 T* KV_DataTypeServer::adoptNamed(std::unique_ptr<T> type, KV_DataType::Naming naming) {
-  if (findType(type->getName()))
+  if (findType(type->getName()) || (symbolDB && symbolDB->findSymbol(type->getName())))
     return nullptr;
   type->naming = std::move(naming);
   T* result = adopt(std::move(type));

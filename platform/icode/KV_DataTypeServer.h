@@ -26,6 +26,8 @@ class KV_PointerTypeServer;
 class KvCIcFileId;
 class KvCSrcRef;
 
+class KV_SymbolDB;
+
 class HUL_PLATFORM_API KV_DataTypeServer {
 public:
   KV_DataTypeServer();
@@ -42,6 +44,9 @@ public:
   KV_ArrayType* demandArrayType(KV_DataType* element, int size);
   KV_StructType* demandStructType(const WmCXString& name);
   KV_DataType* findType(const WmCXString& name) const;
+  // The symbol database whose names named types must not take (a typedef and a variable
+  // of one name would not be C); not owned. Without one, only type names are checked.
+  void setSymbolDB(const KV_SymbolDB* symbols) { symbolDB = symbols; }
 
   // The server of pointer types, the one of the run.
   KV_PointerTypeServer* getPointerServer() { return pointerServer.get(); }
@@ -89,6 +94,7 @@ public:
   KV_DataType* getType(int i) const { return types[static_cast<std::size_t>(i)].get(); }
 
 private:
+  const KV_SymbolDB* symbolDB = nullptr;
   // The numerical and pointer type servers make named types through adoptNamed.
   friend class KV_NumericalTypeServer;
   friend class KV_PointerTypeServer;

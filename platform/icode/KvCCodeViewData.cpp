@@ -51,6 +51,7 @@ KvCCodeViewData::KvCCodeViewData(const WmCXString& applicationName)
       smbClassServer(std::make_unique<KvCSmbClassServer>()),
       templateServer(std::make_unique<KvCTemplateServer>()),
       applServer(std::make_unique<KvCApplicationServer>(this)) {
+  typeServer->setSymbolDB(symbolDB.get());
   for (int l = 0; l < KV_CONV_NUMBER_OF_LEVELS; ++l)
     levels[l] = std::make_unique<KV_OpConversionLevel>(static_cast<tagKvEConversionLevel>(l));
   liveCodeViewData().push_back(this);

@@ -376,3 +376,20 @@ TEST_F(McgSymbolServerTest, ApiFunctionNamedLikeAnIdentifierVariableIsRefused) {
 }
 
 } // namespace
+
+namespace {
+
+// The other order: an RTOS object named like an RTOS type that is not made yet. The type
+// cannot take the variable's name; the type server reports it and answers null.
+TEST_F(McgSymbolServerTest, RtosTypeNamedLikeAnIdentifierVariableIsRefused) {
+  ASSERT_TRUE(boot());
+  ASSERT_NE(server.demandAlarmIdVariable(rtos.createAlarm("TickType"), nullptr), nullptr);
+  messages().clear();
+  EXPECT_EQ(types.demandTickType(nullptr), nullptr);
+  bool checked = false;
+  for (const std::string& text : messageTexts())
+    checked = checked || text.find("KvCMcgTypeServer 640") != std::string::npos;
+  EXPECT_TRUE(checked);
+}
+
+} // namespace
