@@ -9,8 +9,10 @@
 // repeated constructions in one process.
 #include "HulCvTools/ExprLocDBBuilder/KvCExprLocDBBuilder.h"
 #include "HulCvTools/FcnCallGraph/KvCFcgQuery.h"
+#include "HulCvTools/FcnCallGraph/KvCFcnReuseCallGraph.h"
 #include "HulCvTools/FcnCallGraph/KvCFunctionCallGraph.h"
 #include "platform/builder/AppBuilder.h"
+#include "platform/builder/PartitionBuilder.h"
 #include "platform/builder/SyntheticApp.h"
 #include "platform/icode/KvCCodeViewData.h"
 #include "platform/icode/KvCFcgFunctionInfo.h"
@@ -23,7 +25,9 @@
 #include <boost/graph/strong_components.hpp>
 #endif
 
+#include <algorithm>
 #include <chrono>
+#include <string>
 #include <map>
 #include <memory>
 #include <vector>
@@ -294,5 +298,72 @@ void BM_GetAllCaller(benchmark::State& state) {
       benchmark::Counter::kIsIterationInvariantRate | benchmark::Counter::kInvert);
 }
 BENCHMARK(BM_GetAllCaller)->Arg(1'000)->Arg(100'000)->Arg(999'999)->Unit(benchmark::kMillisecond);
+
+// Reuse call graph over a partitioned application: state.range(0) partitions with code of
+// their own, state.range(1) partitions in all (the others instances of them, spread
+// evenly). Every partition of master m is called by master m - 1 (the first masters' by
+// the root), and every master's step function calls an auxiliary function of its own,
+// which calls the next master's auxiliary function. Times construct of the reuse graph
+// over a constructed real graph.
+void BM_ReuseCallGraphConstruct(benchmark::State& state) {
+  const int masters = static_cast<int>(state.range(0));
+  const int partitions = static_cast<int>(state.range(1));
+  auto app = std::make_unique<AppBuilder>();
+  PartitionedAppBuilder model(*app);
+  std::vector<PartitionBuilder*> masterBuilders;
+  for (int m = 0; m < masters; ++m) {
+    std::string name = "M";
+    name += std::to_string(m);
+    PartitionBuilder& master = model.partition(name.c_str()).withTerm();
+    if (m > 0)
+      master.calledBy(*masterBuilders.back());
+    masterBuilders.push_back(&master);
+    std::string aux = "aux";
+    aux += std::to_string(m);
+    model.auxFunction(aux.c_str());
+    master.step().body().call(app->function(aux.c_str()).symbol(), {});
+    if (m > 0) {
+      std::string previous = "aux";
+      previous += std::to_string(m - 1);
+      app->function(previous.c_str()).body().call(app->function(aux.c_str()).symbol(), {});
+    }
+  }
+  for (int i = masters; i < partitions; ++i) {
+    const int m = i % masters;
+    std::string name = "I";
+    name += std::to_string(i);
+    PartitionBuilder& instance =
+        model.instance(name.c_str(), *masterBuilders[static_cast<std::size_t>(m)]);
+    if (m > 0)
+      instance.calledBy(*masterBuilders[static_cast<std::size_t>(m - 1)]);
+  }
+  KvCExprLocDBBuilder builder;
+  builder.boot(&app->data());
+  builder.buildExprLocDBs();
+  KvCFunctionCallGraph real;
+  real.boot();
+  real.construct(false);
+  KvCFcnReuseCallGraph reuse;
+  reuse.boot(&real, &model.view());
+  for (auto _ : state)
+    benchmark::DoNotOptimize(reuse.construct());
+  state.counters["instances"] = partitions;
+  state.counters["ns_per_instance"] =
+      benchmark::Counter(partitions * 1e-9, benchmark::Counter::kIsIterationInvariantRate |
+                                                benchmark::Counter::kInvert);
+  state.counters["edges"] = reuse.number_of_edges();
+  int maxOut = 0;
+  for (leda::node v : reuse.all_nodes())
+    maxOut = std::max(maxOut, reuse.outdeg(v));
+  state.counters["max_outdeg"] = maxOut;
+  reuse.shutdown();
+  real.shutdown();
+}
+BENCHMARK(BM_ReuseCallGraphConstruct)
+    ->Args({100, 1'000})
+    ->Args({1'000, 10'000})
+    ->Args({3'000, 30'000})
+    ->Args({10'000, 100'000})
+    ->Unit(benchmark::kMillisecond);
 
 } // namespace

@@ -15,7 +15,7 @@ install(TARGETS leda HulPlatform HulCvTools
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/HulCvTools
         DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}
         FILES_MATCHING PATTERN "*.h" PATTERN "*.def")
-foreach(_dir leda support icode view)
+foreach(_dir leda support icode view transform)
   if(IS_DIRECTORY ${PROJECT_SOURCE_DIR}/platform/${_dir})
     install(DIRECTORY ${PROJECT_SOURCE_DIR}/platform/${_dir}
             DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/platform

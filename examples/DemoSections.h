@@ -35,5 +35,9 @@ void demoCallGraph(DemoRun& run);
 void demoFixedPoint(DemoRun& run);
 // The RTOS types of multirate code and the OSEK header that declares them.
 void demoRtos(DemoRun& run);
+// The call graph over partitions, with the instances of a reused partition.
+void demoReuseCallGraph(DemoRun& run);
+// Variables replaced through two inlinings, and their chains.
+void demoInlineSymbolDb(DemoRun& run);
 
 #endif

@@ -43,6 +43,7 @@ class KvCCStmTable;
 class KvCCallOperation;
 class KvCCodeBlockOperation;
 class KvCCodeViewData;
+class KvCCompSymbolIterator;
 class KvCExprLocDB;
 class KvCExprLocDBServer;
 class KvCFcgFunctionInfo;

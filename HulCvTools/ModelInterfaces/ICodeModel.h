@@ -57,6 +57,24 @@
 // - KV_ExprLocFactory::createFromName(name, true, srcRef): a location naming the counter's
 //   identifier; createFromValue(0, srcRef): the constant 0; KV_RefFactory::createRef: the
 //   address of a symbol (an operation without location, which createFromOperation takes).
+//
+// What the inline symbol database relies on beyond the operations it names:
+// - KvCUnparamSymbol::isStructInstance(): the variable has component slots (its type is a
+//   structure); isComponent(): it is a component of a structure; getStructSymbol(): for a
+//   component made for a structure instance, that instance, else null (a free component).
+// - KvCCompSymbolIterator(symbol, true, false, true): walks the instance's own component
+//   slots in the order of its type, each slot once, not descending into nested instances
+//   and standing also on slots that are structures or have no symbol; finished() ends the
+//   walk, isValidComponent() says that the slot has a component symbol (false once
+//   finished), getComponent() gives it, next() moves on. A walk over a symbol that is not a
+//   structure instance is finished at once.
+//
+// What the reuse call graph relies on beyond the operations it names:
+// - KvCParamSymbol's function roles (isAuxFunction, isPartitionStepFunction, ...,
+//   isRteApiFuncCall, isRteApiMacroCall, isCalledBySimFrame) are fixed while it is built.
+// - KvCFcgFunctionInfo::isInlinedAtomic() reads the mark the transformation library's
+//   functor sets; isInlined() and isRemoved() are the inlining passes' marks.
+// - KvCFcgFunctionInfo::getSymbol(): the function the info belongs to.
 #ifndef HULCVTOOLS_MODELINTERFACES_ICODEMODEL_H
 #define HULCVTOOLS_MODELINTERFACES_ICODEMODEL_H
 
@@ -99,6 +117,7 @@
 #include "platform/icode/KvCCallOperation.h"
 #include "platform/icode/KvCCodeBlockOperation.h"
 #include "platform/icode/KvCCodeViewData.h"
+#include "platform/icode/KvCCompSymbolIterator.h"
 #include "platform/icode/KvCExprLocDB.h"
 #include "platform/icode/KvCExprLocDBServer.h"
 #include "platform/icode/KvCFcgFunctionInfo.h"

@@ -3,9 +3,19 @@
 #ifndef HULCVTOOLS_MODELINTERFACES_VIEWFWD_H
 #define HULCVTOOLS_MODELINTERFACES_VIEWFWD_H
 
+class KV_BdBlock;
 class KV_BdPartition;
+class KV_BdVisitor;
 class KvCCbActualInterface;
+class KvCCodeBlock;
+class KvCCodeBlockId;
+class KvCIvCallId;
 class KvCIvData;
+class KvCIvFcnReuseTools;
+class KvCIvPartitionDbEntry;
+class KvCIvPdbEntryId;
+class KvCPartitionControlFlow;
+class KvCPartitionIterator;
 class KvCRoAlarm;
 class KvCRoCounter;
 class KvCRoDatabase;
@@ -14,5 +24,6 @@ class KvCRoEvent;
 class KvCRoMessage;
 class KvCRoRTOSInfo;
 class KvCRoResource;
+class KvCSignal;
 
 #endif

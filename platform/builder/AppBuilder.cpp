@@ -105,6 +105,44 @@ KvCUnparamSymbol* AppBuilder::component(const char* name, KV_DataType* type) {
   return cvd->getSymbolDB()->createUnparamSymbol(name, type, true);
 }
 
+namespace {
+void demandAllComponents(KV_SymbolDB* db, KvCUnparamSymbol* instance) {
+  KV_DataType* type = instance->getDataType();
+  KV_StructType* structType = type ? type->asStructType() : nullptr;
+  for (int i = 0; structType && i < structType->getNumberOfComponents(); ++i)
+    demandAllComponents(db, db->demandComponentSymbol(instance, i));
+}
+} // namespace
+
+KvCUnparamSymbol* AppBuilder::structVariable(const char* name, KV_StructType* type, bool define) {
+  KvCUnparamSymbol* v = variable(name, check(type, "structure type"), define);
+  demandAllComponents(cvd->getSymbolDB(), v);
+  return v;
+}
+
+KvCUnparamSymbol* AppBuilder::member(KvCUnparamSymbol* instance, const char* path) {
+  KvCUnparamSymbol* at = check(instance, "structure instance");
+  std::string rest = path;
+  while (true) {
+    const std::size_t dot = rest.find('.');
+    const std::string name = rest.substr(0, dot);
+    KV_DataType* type = at->getDataType();
+    KV_StructType* structType = type ? type->asStructType() : nullptr;
+    if (!structType)
+      fail("not a structure instance: " + at->getName().str());
+    int slot = -1;
+    for (int i = 0; i < structType->getNumberOfComponents(); ++i)
+      if (structType->getComponent(i).name.str() == name)
+        slot = i;
+    if (slot < 0)
+      fail("no component " + name + " in " + at->getName().str());
+    at = cvd->getSymbolDB()->demandComponentSymbol(at, slot);
+    if (dot == std::string::npos)
+      return at;
+    rest = rest.substr(dot + 1);
+  }
+}
+
 FunctionBuilder& AppBuilder::makeFunction(const char* name, KV_DataType* returnType, bool defined) {
   if (functionsByName.count(name))
     fail(std::string("function defined twice: ") + name);

@@ -90,6 +90,13 @@ public:
   KvCUnparamSymbol* variable(const char* name, KV_DataType* type, bool define = true);
   // A structure component symbol (no statement).
   KvCUnparamSymbol* component(const char* name, KV_DataType* type);
+  // A structure instance of `type` with a component symbol for every component, at every
+  // level of nesting. (variable() makes an instance without component symbols; member()
+  // then adds the ones a fixture names.)
+  KvCUnparamSymbol* structVariable(const char* name, KV_StructType* type, bool define = true);
+  // The component symbol of a structure instance named by `path` ("x", or "inner.a" through
+  // nested instances), made when missing. Fails for a component the type does not have.
+  KvCUnparamSymbol* member(KvCUnparamSymbol* instance, const char* path);
   // The function of that name, made on first use: a symbol, a body table (top of its code
   // block) and a definition statement in the current file that owns the body.
   FunctionBuilder& function(const char* name, KV_DataType* returnType = nullptr);

@@ -1,5 +1,6 @@
 #include "platform/icode/KV_SymbolDB.h"
 
+#include "platform/icode/KV_DataType.h"
 #include "platform/icode/KvCParamSymbol.h"
 #include "platform/icode/KvCUnparamSymbol.h"
 
@@ -32,6 +33,27 @@ KvCUnparamSymbol* KV_SymbolDB::createUnparamSymbol(const WmCXString& name, KV_Da
   KvCUnparamSymbol* result = symbol.get();
   enter(std::move(symbol));
   return result;
+}
+
+KvCUnparamSymbol* KV_SymbolDB::demandComponentSymbol(KvCUnparamSymbol* structSymbol, int i) {
+  KV_DataType* type = structSymbol ? structSymbol->getDataType() : nullptr;
+  KV_StructType* structType = type ? type->asStructType() : nullptr;
+  if (!structType || i < 0 || i >= structType->getNumberOfComponents())
+    return nullptr;
+  if (KvCUnparamSymbol* existing = structSymbol->getComponentSymbol(i))
+    return existing;
+  const KV_StructType::Component& slot = structType->getComponent(i);
+  // Not entered by name: the name is the component's, not one of a scope.
+  auto made = std::make_unique<KvCUnparamSymbol>(getNumberOfSymbols() + 1, slot.name, slot.type,
+                                                 true);
+  KvCUnparamSymbol* component = made.get();
+  symbols.push_back(std::move(made));
+  component->structSymbol = structSymbol;
+  component->componentIndex = i;
+  structSymbol->componentSymbols.resize(
+      static_cast<std::size_t>(structType->getNumberOfComponents()), nullptr);
+  structSymbol->componentSymbols[static_cast<std::size_t>(i)] = component;
+  return component;
 }
 
 KvCSymbol* KV_SymbolDB::findSymbol(const WmCXString& name) const {

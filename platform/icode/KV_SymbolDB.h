@@ -23,6 +23,11 @@ public:
 
   KvCParamSymbol* createParamSymbol(const WmCXString& name, KV_DataType* returnType, bool macro);
   KvCUnparamSymbol* createUnparamSymbol(const WmCXString& name, KV_DataType* type, bool component);
+  // The component symbol of slot `i` of the structure instance `structSymbol`, named and
+  // typed after component i of its structure type; made (and joined to the instance) when
+  // missing. Null when the symbol is not a structure instance or has no slot i. Such
+  // components are numbered like every symbol but not found by name (findSymbol).
+  KvCUnparamSymbol* demandComponentSymbol(KvCUnparamSymbol* structSymbol, int i);
 
   KvCSymbol* findSymbol(const WmCXString& name) const;
   int getNumberOfSymbols() const { return static_cast<int>(symbols.size()); }

@@ -57,6 +57,8 @@ public:
   void setRemoved(bool value) { removed = value; }
   bool isInlinedAtomically() const { return inlinedAtomically; }
   void setInlinedAtomically(bool value) { inlinedAtomically = value; }
+  // The same mark, as the reuse call graph reads it.
+  bool isInlinedAtomic() const { return inlinedAtomically; }
 
   KvCIcFileId* getFile() const { return file; }
   void setFile(KvCIcFileId* f) { file = f; }

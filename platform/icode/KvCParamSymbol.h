@@ -6,6 +6,11 @@
 // signature: the symbol flag word, the function class, and per formal parameter a name,
 // a type, a scaling and a flag word (hasSignature). The return type is the symbol's data
 // type, the return scaling its scaling. Symbols made otherwise have no signature.
+//
+// In partitioned code a function also has roles of its own (tagKvEFunctionRole: partition
+// step/init/term/restart function, auxiliary function, RTE API call, called by the
+// simulation frame) and may point to its code block in the view (not owned; null for a
+// function without one).
 #ifndef HUL_PLATFORM_ICODE_KVCPARAMSYMBOL_H
 #define HUL_PLATFORM_ICODE_KVCPARAMSYMBOL_H
 
@@ -15,8 +20,22 @@
 #include <vector>
 
 class KvCCStmTable;
+class KvCCodeBlockId;
 class KvCFcgFunctionInfo;
 class KvCFcnClassId;
+
+// Roles of a function in partitioned code (a word of its own beside the symbol roles).
+enum tagKvEFunctionRole : unsigned {
+  KV_FROLE_AUX_FUNCTION = 1u << 0,        // an auxiliary function of generated code
+  KV_FROLE_PARTITION_STEP = 1u << 1,      // the step function of a partition
+  KV_FROLE_PARTITION_INIT = 1u << 2,      // the init function of a partition
+  KV_FROLE_PARTITION_TERM = 1u << 3,      // the term function of a partition
+  KV_FROLE_PARTITION_RESTART = 1u << 4,   // the restart function of a partition
+  KV_FROLE_RTE_API_FUNC_CALL = 1u << 5,   // a call of an RTE API function
+  KV_FROLE_RTE_API_MACRO_CALL = 1u << 6,  // a call of an RTE API macro
+  KV_FROLE_CALLED_BY_SIM_FRAME = 1u << 7, // called by the simulation frame
+  KV_FROLE_ATOMIC_INLINE = 1u << 8,       // to be inlined as a whole, when inlined
+};
 
 class HUL_PLATFORM_API KvCParamSymbol : public KvCSymbol {
 public:
@@ -37,6 +56,23 @@ public:
   // The function's code is imported from outside the generated code.
   bool isImportedCodeBlock() const { return hasRole(KV_ROLE_IMPORTED_CODE_BLOCK); }
   bool isTaskFunction() const { return hasRole(KV_ROLE_TASK_FUNCTION); }
+
+  // The code block of the function in the view, or null (a function without one).
+  KvCCodeBlockId* getCodeBlockId() const { return codeBlockId; }
+  void setCodeBlockId(KvCCodeBlockId* id) { codeBlockId = id; }
+  bool hasFunctionRole(tagKvEFunctionRole role) const { return (functionRoles & role) != 0; }
+  void setFunctionRole(tagKvEFunctionRole role, bool value) {
+    functionRoles = value ? (functionRoles | role) : (functionRoles & ~static_cast<unsigned>(role));
+  }
+  bool isAuxFunction() const { return hasFunctionRole(KV_FROLE_AUX_FUNCTION); }
+  bool isPartitionStepFunction() const { return hasFunctionRole(KV_FROLE_PARTITION_STEP); }
+  bool isPartitionInitFunction() const { return hasFunctionRole(KV_FROLE_PARTITION_INIT); }
+  bool isPartitionTermFunction() const { return hasFunctionRole(KV_FROLE_PARTITION_TERM); }
+  bool isPartitionRestartFunction() const { return hasFunctionRole(KV_FROLE_PARTITION_RESTART); }
+  bool isRteApiFuncCall() const { return hasFunctionRole(KV_FROLE_RTE_API_FUNC_CALL); }
+  bool isRteApiMacroCall() const { return hasFunctionRole(KV_FROLE_RTE_API_MACRO_CALL); }
+  bool isCalledBySimFrame() const { return hasFunctionRole(KV_FROLE_CALLED_BY_SIM_FRAME); }
+  bool isAtomicInlineFunction() const { return hasFunctionRole(KV_FROLE_ATOMIC_INLINE); }
 
   // One formal parameter of the signature.
   struct FormalParam {
@@ -67,6 +103,8 @@ private:
   unsigned int symbolFlags = 0;
   KvCFcnClassId* functionClass = nullptr;
   std::vector<FormalParam> formals;
+  KvCCodeBlockId* codeBlockId = nullptr;
+  unsigned functionRoles = 0;
 };
 
 #endif

@@ -1,0 +1,3 @@
+#include "HulCvTools/InlineSymbolDb/KvCInlineSymbolDbEntry.h"
+
+HULCV_DEFINE_HEAP_OPERATORS(KvCInlineSymbolDbEntry)
