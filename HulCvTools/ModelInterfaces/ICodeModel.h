@@ -92,6 +92,7 @@
 #include "platform/icode/KV_FunctionSymbolServer.h"
 #include "platform/icode/KV_ICodeElemVisitor.h"
 #include "platform/icode/KV_ICodeFactoryContainer.h"
+#include "platform/icode/KV_LogObj.h"
 #include "platform/icode/KV_MacroSymbolServer.h"
 #include "platform/icode/KV_OpConversionInfo.h"
 #include "platform/icode/KV_OpConversionLevel.h"

@@ -27,6 +27,27 @@ bool KV_DataType::isSameType(KV_DataType* other) const {
   return other && endOfBaseChain(this) == endOfBaseChain(other);
 }
 
+bool KV_DataType::isKind10() const {
+  const KV_DataType* end = endOfBaseChain(this);
+  return end->kind == KV_TYPE_NUMERICAL &&
+         static_cast<const KV_NumericalType*>(end)->isBooleanBaseType();
+}
+
+KV_NumericalType* KV_NumericalType::getNumBaseType() {
+  KV_NumericalType* type = this;
+  while (KV_DataType* base = type->getBaseType()) {
+    KV_NumericalType* numerical = base->asNumericalType();
+    if (!numerical)
+      break;
+    type = numerical;
+  }
+  return type;
+}
+
+bool KV_NumericalType::isBooleanBaseType() const {
+  return getBaseType() == nullptr && !isDataDictionaryType() && getName() == WmCXString("Bool");
+}
+
 KvCExprLocDB* KV_DataType::getExprLocDB() {
   if (!db)
     db = std::make_unique<KvCExprLocDB>();

@@ -65,6 +65,18 @@ public:
   virtual KV_ArrayType* asArrayType() { return nullptr; }
   virtual bool isFloat() const { return false; }
 
+  // The kind predicates the Data Dictionary's base-type vocabulary rests on. A kind answered
+  // by an as...Type predicate gives the type itself when it is of that kind, else null:
+  // kind 15 is void, kind 9 a pointer, kind 12 a structure; kinds 13 and 14 (unions and
+  // enumerations) are kinds this model does not make, so it answers null for them. Kind 10
+  // is the boolean: the type, followed through its base types, is the base type "Bool".
+  KV_DataType* asKind15Type() { return kind == KV_TYPE_VOID ? this : nullptr; }
+  KV_DataType* asKind9Type() { return kind == KV_TYPE_POINTER ? this : nullptr; }
+  KV_DataType* asKind12Type() { return kind == KV_TYPE_STRUCT ? this : nullptr; }
+  KV_DataType* asKind13Type() { return nullptr; }
+  KV_DataType* asKind14Type() { return nullptr; }
+  bool isKind10() const;
+
   bool isEqualType(KV_DataType* other) const;
   bool isEqualTypeRef(KV_DataType* other) const { return this == other; }
 
@@ -144,6 +156,26 @@ public:
   bool isFloat() const override { return floating; }
   int getBits() const { return bits; }
   bool isSigned() const { return isSignedType; }
+
+  // The numerical type at the end of this type's base-type chain (the type itself when it
+  // is not made from another numerical type).
+  KV_NumericalType* getNumBaseType();
+  // The base-type kinds of a numerical base type: 1 to 6 the signed and unsigned 8, 16 and
+  // 32 bit integers (in that order, signed first), 7 and 8 the 32 and 64 bit floating-point
+  // types, 16 the signed and 17 the unsigned 64 bit integer. The boolean base type "Bool"
+  // is of none of these kinds. Other widths are of no kind.
+  bool isKind1() const { return isInteger(8, true); }
+  bool isKind2() const { return isInteger(8, false); }
+  bool isKind3() const { return isInteger(16, true); }
+  bool isKind4() const { return isInteger(16, false); }
+  bool isKind5() const { return isInteger(32, true); }
+  bool isKind6() const { return isInteger(32, false); }
+  bool isKind7() const { return floating && bits == 32; }
+  bool isKind8() const { return floating && bits == 64; }
+  bool isKind16() const { return isInteger(64, true); }
+  bool isKind17() const { return isInteger(64, false); }
+  // Whether this is the boolean base type "Bool".
+  bool isBooleanBaseType() const;
   // Whether the code generator keeps its range handling (saturation, rounding of limits)
   // off this type; set per type by the code generator.
   bool isExemptFromRangeHandling() const { return exempt; }
@@ -156,6 +188,10 @@ protected:
   bool hasEqualStructure(const KV_DataType& other) const override;
 
 private:
+  bool isInteger(int width, bool signedness) const {
+    return !floating && bits == width && isSignedType == signedness && !isBooleanBaseType();
+  }
+
   int bits;
   bool isSignedType;
   bool floating;

@@ -40,6 +40,9 @@ enum tagKvESymbolRole : unsigned {
   KV_ROLE_SET_ABS_ALARM = 1u << 17,
   KV_ROLE_SET_REL_ALARM = 1u << 18,
   KV_ROLE_CANCEL_ALARM = 1u << 19,
+  KV_ROLE_STARTUP_FUNCTION = 1u << 20,
+  KV_ROLE_AP_ENTRY_FUNCTION = 1u << 21,
+  KV_ROLE_AP_EXIT_FUNCTION = 1u << 22,
 };
 
 class HUL_PLATFORM_API KvCSymbol {
@@ -70,6 +73,11 @@ public:
   bool isInitFunction() const { return hasRole(KV_ROLE_INIT_FUNCTION); }
   bool isTermFunction() const { return hasRole(KV_ROLE_TERM_FUNCTION); }
   bool isLogMacro() const { return hasRole(KV_ROLE_LOG_MACRO); }
+  // The function run once when the application starts, and the functions run on entering
+  // and on leaving an application partition.
+  bool isStartupFunction() const { return hasRole(KV_ROLE_STARTUP_FUNCTION); }
+  bool isApEntryFunction() const { return hasRole(KV_ROLE_AP_ENTRY_FUNCTION); }
+  bool isApExitFunction() const { return hasRole(KV_ROLE_AP_EXIT_FUNCTION); }
   bool isSideEffectFreeFunction() const { return hasRole(KV_ROLE_SIDE_EFFECT_FREE); }
   bool isRtosScheduleFcn() const { return hasRole(KV_ROLE_RTOS_SCHEDULE_FCN); }
   void markAsSideEffectFreeFunction() { setRole(KV_ROLE_SIDE_EFFECT_FREE, true); }
