@@ -45,6 +45,7 @@ int main(int argc, char** argv) {
     demoCallGraph(run);
     demoFixedPoint(run);
     demoRtos(run);
+    demoDdEnums(run);
     demoReuseCallGraph(run);
     demoInlineSymbolDb(run);
   }

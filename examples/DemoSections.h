@@ -40,4 +40,7 @@ void demoReuseCallGraph(DemoRun& run);
 // Variables replaced through two inlinings, and their chains.
 void demoInlineSymbolDb(DemoRun& run);
 
+// Properties translated to and from the Data Dictionary.
+void demoDdEnums(DemoRun& run);
+
 #endif
