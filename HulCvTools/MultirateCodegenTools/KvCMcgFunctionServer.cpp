@@ -4,6 +4,7 @@
 #include "HulCvTools/Control/KvCInternalCheck.h"
 #include "HulCvTools/ModelInterfaces/ICodeModel.h"
 #include "HulCvTools/ModelInterfaces/ViewModel.h"
+#include "HulCvTools/MultirateCodegenTools/KvCMcgBootSupport.h"
 #include "HulCvTools/MultirateCodegenTools/KvCMcgTypeServer.h"
 #include "platform/support/KvCCIdentifier.h"
 #include "platform/support/KvCInternalSrcRef.h"
@@ -125,8 +126,7 @@ bool KvCMcgFunctionServer::bootPhaseOne(KvCCodeViewData* codeViewData,
   activateTask = terminateTask = triggerTask = setEvent = getEvent = clearEvent = waitEvent =
       nullptr;
   sendMessage = receiveMessage = lockMessage = unlockMessage = nullptr;
-  disableAllInterrupts = enableAllInterrupts = suspendAllInterrupts = resumeAllInterrupts =
-      nullptr;
+  disableAllInterrupts = enableAllInterrupts = suspendAllInterrupts = resumeAllInterrupts = nullptr;
   suspendOSInterrupts = resumeOSInterrupts = getResource = releaseResource = nullptr;
   enterCriticalSection = leaveCriticalSection = schedule = lastInitCounter = nullptr;
   setRelAlarm = setAbsAlarm = startISRDummy = nullptr;
@@ -144,17 +144,9 @@ bool KvCMcgFunctionServer::bootPhaseTwo() {
   KV_SymbolServer* symbols = factories->getSymbolServer();
   functionSymbolServer = symbols ? symbols->getFunction() : nullptr;
   applicationServer = codeView->getApplServer();
-  internalSrcRef = codeView->getSrcRefServer()->getSrcRef();
-  if (internalSrcRef) {
-    internalSrcRef->setLocation(__FILE__, __LINE__);
-    internalSrcRef->setCause("rtos api function");
-  }
-  KvCIcFileId* header = nullptr;
-  KvCIcFileId* cFile = nullptr;
-  if (!fileServer->demandAcmeFiles(header, cFile, internalSrcRef) || !header)
-    return false;
-  acmeHeaderFile = header->getFile();
-  return true;
+  internalSrcRef = kvMcgInternalSrcRef(codeView, __FILE__, __LINE__, "rtos api function");
+  acmeHeaderFile = kvMcgAcmeHeader(fileServer, internalSrcRef);
+  return acmeHeaderFile != nullptr;
 }
 
 bool KvCMcgFunctionServer::isReady() const {
@@ -303,8 +295,8 @@ KvCParamSymbol* KvCMcgFunctionServer::demandOsekApiActivateTask(const KvCSrcRef*
 
 KvCParamSymbol* KvCMcgFunctionServer::demandOsekApiTerminateTask(const KvCSrcRef* srcRef) {
   static const ApiSpec spec{
-      "TerminateTask", false, 0, {kNone}, kParamFlag, TypeOf::Status, ScalingOf::Standard,
-      kTerminateTask};
+      "TerminateTask",     false,         0, {kNone}, kParamFlag, TypeOf::Status,
+      ScalingOf::Standard, kTerminateTask};
   return demandApi(terminateTask, spec, srcRef);
 }
 
@@ -411,9 +403,8 @@ KvCParamSymbol* KvCMcgFunctionServer::demandOsekApiReleaseResource(const KvCSrcR
 // The interrupt functions: no parameters, void with the default void scaling, SEF.
 #define HULCV_MCG_VOID_API(Operation, Name, cache)                                                 \
   KvCParamSymbol* KvCMcgFunctionServer::Operation(const KvCSrcRef* srcRef) {                       \
-    static const ApiSpec spec{Name,         false,                  0,              {kNone},       \
-                              0,            TypeOf::Void,           ScalingOf::DefaultVoid,        \
-                              kSideEffectFree};                                                    \
+    static const ApiSpec spec{                                                                     \
+        Name, false, 0, {kNone}, 0, TypeOf::Void, ScalingOf::DefaultVoid, kSideEffectFree};        \
     return demandApi(cache, spec, srcRef);                                                         \
   }
 
@@ -495,8 +486,7 @@ WmCXString KvCMcgFunctionServer::getTemplateKeyAsString(tagKvEFunctionTplKey key
 
 bool KvCMcgFunctionServer::getUserFunctionSettings(tagKvEFunctionTplKey key,
                                                    WmCXString& functionName,
-                                                   KvCFcnClassId*& fcnClass,
-                                                   KvCIcFileId*& codeFile,
+                                                   KvCFcnClassId*& fcnClass, KvCIcFileId*& codeFile,
                                                    const KvCSrcRef* srcRef) {
   functionName = WmCXString();
   fcnClass = nullptr;
@@ -655,14 +645,14 @@ KvCParamSymbol* KvCMcgFunctionServer::demandUserDefined(KvCParamSymbol*& cache, 
   return cache;
 }
 
-KvCParamSymbol* KvCMcgFunctionServer::demandUserDefinedEnterCriticalSection(
-    int nParams, const KvCSrcRef* srcRef) {
+KvCParamSymbol*
+KvCMcgFunctionServer::demandUserDefinedEnterCriticalSection(int nParams, const KvCSrcRef* srcRef) {
   static const UserSpec spec{KV_FCN_TPL_ENTER_CRITICAL_SECTION};
   return demandUserDefined(enterCriticalSection, nEnterCSParams, spec, nParams, srcRef);
 }
 
-KvCParamSymbol* KvCMcgFunctionServer::demandUserDefinedLeaveCriticalSection(
-    int nParams, const KvCSrcRef* srcRef) {
+KvCParamSymbol*
+KvCMcgFunctionServer::demandUserDefinedLeaveCriticalSection(int nParams, const KvCSrcRef* srcRef) {
   static const UserSpec spec{KV_FCN_TPL_LEAVE_CRITICAL_SECTION};
   return demandUserDefined(leaveCriticalSection, nLeaveCSParams, spec, nParams, srcRef);
 }
@@ -698,10 +688,9 @@ KvCParamSymbol* KvCMcgFunctionServer::demandOsekApiCancelAlarm(const KvCSrcRef* 
     KV_INTERNAL_CHECK_SRC(srcRef, kErrorCode, kNoSignatureType);
     return nullptr;
   }
-  KvCParamSymbol* symbol =
-      inserter.demandFunctionSymbol("CancelAlarm", status, scaleServer->getDefaultScaling(), 1,
-                                    accesses.get(), types, scalings, header->getFileId(), srcRef,
-                                    false);
+  KvCParamSymbol* symbol = inserter.demandFunctionSymbol(
+      "CancelAlarm", status, scaleServer->getDefaultScaling(), 1, accesses.get(), types, scalings,
+      header->getFileId(), srcRef, false);
   if (!symbol) {
     KV_INTERNAL_CHECK_SRC(srcRef, kErrorCode, kNoSymbol);
     return nullptr;
@@ -795,8 +784,8 @@ KvCParamSymbol* KvCMcgFunctionServer::demandCounterFcn(CounterFcn which, const K
     types[n] = tick && pointers ? pointers->getScalarPointer(tick, srcRef) : nullptr;
     scalings[n++] = tickScaling;
   }
-  KV_DataType* returnType = kind == 7 ? typeServer->demandTickType(srcRef)
-                                      : typeServer->demandStatusType(srcRef);
+  KV_DataType* returnType =
+      kind == 7 ? typeServer->demandTickType(srcRef) : typeServer->demandStatusType(srcRef);
   KV_Scaling* returnScaling = init ? scaleServer->getDefaultScaling() : tickScaling;
   bool complete = returnType && returnScaling;
   for (int i = 0; i < n; ++i)
@@ -840,8 +829,9 @@ KvCParamSymbol* KvCMcgFunctionServer::demandCounterFcn(CounterFcn which, const K
   return symbol;
 }
 
-KvCParamSymbol* KvCMcgFunctionServer::demandExtOsekApiInitCounter(
-    const KvCSrcRef* srcRef, KvCRoCounter* counter, leda::array<KV_ExprLocation*>& actuals) {
+KvCParamSymbol*
+KvCMcgFunctionServer::demandExtOsekApiInitCounter(const KvCSrcRef* srcRef, KvCRoCounter* counter,
+                                                  leda::array<KV_ExprLocation*>& actuals) {
   return demandCounterFcn(CounterFcn::InitCounter, srcRef, counter, nullptr, actuals);
 }
 

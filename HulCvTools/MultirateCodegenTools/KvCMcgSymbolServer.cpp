@@ -3,6 +3,7 @@
 #include "HulCvTools/Control/KvCInternalCheck.h"
 #include "HulCvTools/ModelInterfaces/ICodeModel.h"
 #include "HulCvTools/ModelInterfaces/ViewModel.h"
+#include "HulCvTools/MultirateCodegenTools/KvCMcgBootSupport.h"
 #include "HulCvTools/MultirateCodegenTools/KvCMcgTypeServer.h"
 #include "platform/support/KvCCIdentifier.h"
 #include "platform/support/KvCInternalSrcRef.h"
@@ -42,18 +43,11 @@ bool KvCMcgSymbolServer::bootPhaseTwo() {
   KvCIcFileServer* fileServer = factories ? factories->getFileServer() : nullptr;
   if (!KV_VERIFY(codeView && fileServer && ivData, kErrorCode, 100))
     return false;
-  internalSrcRef = codeView->getSrcRefServer()->getSrcRef();
-  if (internalSrcRef) {
-    internalSrcRef->setLocation(__FILE__, __LINE__);
-    internalSrcRef->setCause("rtos object identifier symbol");
-  }
+  internalSrcRef =
+      kvMcgInternalSrcRef(codeView, __FILE__, __LINE__, "rtos object identifier symbol");
   rootPartition = ivData->getIvRootPartition();
-  KvCIcFileId* header = nullptr;
-  KvCIcFileId* cFile = nullptr;
-  if (!fileServer->demandAcmeFiles(header, cFile, internalSrcRef) || !header)
-    return false;
-  acmeHeaderFile = header->getFile();
-  return true;
+  acmeHeaderFile = kvMcgAcmeHeader(fileServer, internalSrcRef);
+  return acmeHeaderFile != nullptr;
 }
 
 KV_ExprDescrTupel* KvCMcgSymbolServer::createIdVariable(const WmCXString& name,

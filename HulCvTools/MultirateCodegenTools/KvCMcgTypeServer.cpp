@@ -4,6 +4,7 @@
 #include "HulCvTools/Control/KvCInternalCheck.h"
 #include "HulCvTools/ModelInterfaces/ICodeModel.h"
 #include "HulCvTools/ModelInterfaces/ViewModel.h"
+#include "HulCvTools/MultirateCodegenTools/KvCMcgBootSupport.h"
 #include "platform/support/KvCInternalSrcRef.h"
 #include "platform/support/KvCSrcRefServer.h"
 #include "platform/support/WmCXString.h"
@@ -38,28 +39,18 @@ bool KvCMcgTypeServer::bootPhaseTwo() {
   if (!KV_VERIFY(codeView && factories && fileServer && rtosDatabase, kErrorCode, 100))
     return false;
   numericalTypeServer = factories->getNumTypeServer();
-  internalSrcRef = codeView->getSrcRefServer()->getSrcRef();
-  if (internalSrcRef) {
-    internalSrcRef->setLocation(__FILE__, __LINE__);
-    internalSrcRef->setCause("rtos api function");
-  }
-  KvCIcFileId* header = nullptr;
-  KvCIcFileId* cFile = nullptr;
-  if (!fileServer->demandRootFiles(header, cFile, internalSrcRef) || !header)
+  internalSrcRef = kvMcgInternalSrcRef(codeView, __FILE__, __LINE__, "rtos api function");
+  rootHeaderFile = kvMcgRootHeader(fileServer, internalSrcRef);
+  if (!rootHeaderFile)
     return false;
-  rootHeaderFile = header->getFile();
   if (KV_ScaleServer* scales = factories->getScalingServer())
     standardScaling = scales->getScaling(1.0, 0.0, internalSrcRef);
   baseTypeServer = factories->getBaseTypeServer();
   standardBaseType = baseTypeServer ? baseTypeServer->getInt8() : nullptr;
   KvCRoRTOSInfo* info = rtosDatabase->demandRTOSInfo();
   rtosDataTypes = info ? info->getDataTypes() : nullptr;
-  header = nullptr;
-  cFile = nullptr;
-  if (!fileServer->demandAcmeFiles(header, cFile, internalSrcRef) || !header)
-    return false;
-  acmeHeaderFile = header->getFile();
-  return true;
+  acmeHeaderFile = kvMcgAcmeHeader(fileServer, internalSrcRef);
+  return acmeHeaderFile != nullptr;
 }
 
 KV_DataType* KvCMcgTypeServer::getStandardBaseType() const { return standardBaseType; }
