@@ -45,6 +45,8 @@ int main(int argc, char** argv) {
     demoCallGraph(run);
     demoFixedPoint(run);
     demoRtos(run);
+    demoEcp(run);
+    demoSymbolTools(run);
     demoDdEnums(run);
     demoReuseCallGraph(run);
     demoInlineSymbolDb(run);

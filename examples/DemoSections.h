@@ -35,6 +35,11 @@ void demoCallGraph(DemoRun& run);
 void demoFixedPoint(DemoRun& run);
 // The RTOS types of multirate code and the OSEK header that declares them.
 void demoRtos(DemoRun& run);
+// The Ecp tools' object identifiers, access-point macros and ECU service function, the
+// headers that define them and an expansion of the macros.
+void demoEcp(DemoRun& run);
+// A variable moved into a function and back; a nested component's inherited specifiers.
+void demoSymbolTools(DemoRun& run);
 // The call graph over partitions, with the instances of a reused partition.
 void demoReuseCallGraph(DemoRun& run);
 // Variables replaced through two inlinings, and their chains.

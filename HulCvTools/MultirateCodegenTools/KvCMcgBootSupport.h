@@ -1,6 +1,6 @@
-// What the RTOS servers' second boot phases share (internal to the library, not exported):
-// the internal source reference each server makes for its model calls, and the header
-// file of a file pair.
+// What the second boot phases of the RTOS and the Ecp servers share (internal to the
+// library, not exported): the internal source reference each server makes for its model
+// calls, and the header file of a file pair.
 #ifndef HULCVTOOLS_MULTIRATECODEGENTOOLS_KVCMCGBOOTSUPPORT_H
 #define HULCVTOOLS_MULTIRATECODEGENTOOLS_KVCMCGBOOTSUPPORT_H
 

@@ -8,6 +8,7 @@
 #include "platform/icode/KV_ScaleServer.h"
 #include "platform/icode/KV_Statement.h"
 #include "platform/icode/KV_SymbolDB.h"
+#include "platform/icode/KvCAddressQualifier.h"
 #include "platform/icode/KvCCStmTable.h"
 #include "platform/icode/KvCCallOperation.h"
 #include "platform/icode/KvCCodeBlockOperation.h"
@@ -15,8 +16,12 @@
 #include "platform/icode/KvCIcFileId.h"
 #include "platform/icode/KvCIcFileServer.h"
 #include "platform/icode/KvCParamSymbol.h"
+#include "platform/icode/KvCSmbClassServer.h"
 #include "platform/icode/KvCSmbInitValExpr.h"
+#include "platform/icode/KvCSymbolQuery.h"
 #include "platform/icode/KvCUnparamSymbol.h"
+#include "platform/icode/KvCVarClassServer.h"
+#include "platform/support/KvCNameSpace.h"
 
 #include <cstdio>
 #include <cstdlib>
@@ -92,6 +97,62 @@ BlockBuilder& AppBuilder::newBlockBuilder(KvCCStmTable* table) {
   return blocks.back();
 }
 
+// --- scopes and symbol classes
+
+KvCIcFileId* AppBuilder::filePair(const char* base) {
+  const std::string stem = base;
+  KvCIcFileId* header = file((stem + ".h").c_str());
+  KvCIcFileId* source = file((stem + ".c").c_str());
+  header->getFile()->setComplementaryFile(source);
+  source->getFile()->setComplementaryFile(header);
+  nameSpace(header->getFile()->getStt());
+  nameSpace(source->getFile()->getStt());
+  return source;
+}
+
+KvCNameSpace* AppBuilder::nameSpace(KvCCStmTable* table) {
+  check(table, "name space of a null table");
+  if (!table->getNameSpace())
+    table->setNameSpace(cvd->createNameSpace());
+  return table->getNameSpace();
+}
+
+KvCNameSpace* AppBuilder::potentialGlobals() {
+  return cvd->getApplication()->getSubApplications().front()->getPotentialGlobalsNameSpace();
+}
+
+KvCSmbClassId* AppBuilder::smbClass(const char* name, tagKvESmbClassKind kind) {
+  KvCSmbClassServer* classes = cvd->getSmbClassServer();
+  if (KvCSmbClassId* existing = classes->findSmbClass(name))
+    return existing;
+  const bool isExtern = kind == KV_SMBCLASS_EXTERN;
+  KvCVarClassId* varClass = factories().getVarClassServer()->demandVarClass(
+      name, isExtern, isExtern || kind == KV_SMBCLASS_GLOBAL);
+  KvCFcnClassId* fcnClass = classes->getFcnClassServer()->createFcnClass(name, nullptr);
+  return check(classes->createSmbClass(name, kind, varClass, fcnClass), "symbol class");
+}
+
+KvCSymbol* AppBuilder::place(KvCSymbol* symbol, KvCSmbClassId* cls, KvCCStmTable* table,
+                             bool asDeclaration) {
+  check(symbol, "place a null symbol");
+  check(cls, "place with a null class");
+  check(table, "place into a null table");
+  if (KvCUnparamSymbol* variable = symbol->asUnparamSymbol())
+    variable->setVarClassId(cls->getVarClassId());
+  else
+    symbol->asParamSymbol()->setFcnClassId(cls->getFcnClassId());
+  KvCSymbol* entered = symbol;
+  if (asDeclaration)
+    table->enterDeclaration(entered);
+  else
+    table->enterSymbol(entered);
+  if (entered != symbol)
+    fail("place: the table holds another " + symbol->getName().str());
+  if (KvCSymbolQuery::isPotentialGlobalSymbol(symbol, table))
+    potentialGlobals()->add(symbol->getName());
+  return symbol;
+}
+
 // --- symbols
 
 KvCUnparamSymbol* AppBuilder::variable(const char* name, KV_DataType* type, bool define) {
@@ -126,8 +187,7 @@ KvCUnparamSymbol* AppBuilder::member(KvCUnparamSymbol* instance, const char* pat
   while (true) {
     const std::size_t dot = rest.find('.');
     const std::string name = rest.substr(0, dot);
-    KV_DataType* type = at->getDataType();
-    KV_StructType* structType = type ? type->asStructType() : nullptr;
+    KV_StructType* structType = at->getSlotStructType();
     if (!structType)
       fail("not a structure instance: " + at->getName().str());
     int slot = -1;
@@ -141,6 +201,15 @@ KvCUnparamSymbol* AppBuilder::member(KvCUnparamSymbol* instance, const char* pat
       return at;
     rest = rest.substr(dot + 1);
   }
+}
+
+KvCUnparamSymbol* AppBuilder::declaredComponent(KV_StructType* type, const char* name) {
+  return check(cvd->getSymbolDB()->demandComponentDeclSymbol(check(type, "structure type"), name),
+               "component declaration");
+}
+
+KvCAddressQualifier* AppBuilder::addressQualifier(const char* name, bool isDefault) {
+  return check(cvd->demandAddressQualifier(name, isDefault), "address qualifier");
 }
 
 FunctionBuilder& AppBuilder::makeFunction(const char* name, KV_DataType* returnType, bool defined) {

@@ -39,8 +39,11 @@ class KV_QualifiedSymbolOp;
 class KV_Scaling;
 class KvCIcCodeUnit;
 class KvCIcExpression;
+class KvCAddressQualifier;
 class KvCIcFileId;
+class KvCNameSpace;
 class KvCRtosProtection;
+class KvCSmbClassId;
 
 // One index of an array access: a constant or an index expression.
 struct BuilderIndex {
@@ -84,6 +87,25 @@ public:
   // The builder of the current file's top-level table.
   BlockBuilder& fileScope();
 
+  // --- scopes and symbol classes
+  // The source file `<base>.c` and its header `<base>.h`, added to the code unit and named
+  // as each other's complementary file, each top-level table with a name space of its
+  // own. The source file becomes the current file; the answer is it.
+  KvCIcFileId* filePair(const char* base);
+  // The name space of `table`, made when it has none.
+  KvCNameSpace* nameSpace(KvCCStmTable* table);
+  // The potential-globals name space of the application's sub-application.
+  KvCNameSpace* potentialGlobals();
+  // The symbol class of that name, made on first use with `kind`, together with a
+  // variable class (extern for KV_SMBCLASS_EXTERN, global for it and KV_SMBCLASS_GLOBAL)
+  // and a function class of the same name that stand for it.
+  KvCSmbClassId* smbClass(const char* name, tagKvESmbClassKind kind);
+  // Gives `symbol` the variable or function class of `cls` and enters it into `table` as
+  // a definition (or a declaration); a potential global there also takes its name in the
+  // potential-globals name space. Fails when the table answers another symbol.
+  KvCSymbol* place(KvCSymbol* symbol, KvCSmbClassId* cls, KvCCStmTable* table,
+                   bool asDeclaration = false);
+
   // --- symbols
   // A variable; with `define`, a definition statement (object, type, file) is added to
   // the current file.
@@ -94,9 +116,15 @@ public:
   // level of nesting. (variable() makes an instance without component symbols; member()
   // then adds the ones a fixture names.)
   KvCUnparamSymbol* structVariable(const char* name, KV_StructType* type, bool define = true);
-  // The component symbol of a structure instance named by `path` ("x", or "inner.a" through
-  // nested instances), made when missing. Fails for a component the type does not have.
+  // The component symbol of a structure instance (or array of structures) named by `path`
+  // ("x", or "inner.a" through nested instances), made when missing. Fails for a component
+  // the type does not have.
   KvCUnparamSymbol* member(KvCUnparamSymbol* instance, const char* path);
+  // The symbol that declares component `name` in `type` (it carries the specifiers the
+  // declaration writes), made when missing. Fails for a component the type does not have.
+  KvCUnparamSymbol* declaredComponent(KV_StructType* type, const char* name);
+  // The address qualifier of that name (made on first use; `isDefault` applies then).
+  KvCAddressQualifier* addressQualifier(const char* name, bool isDefault = false);
   // The function of that name, made on first use: a symbol, a body table (top of its code
   // block) and a definition statement in the current file that owns the body.
   FunctionBuilder& function(const char* name, KV_DataType* returnType = nullptr);

@@ -17,6 +17,8 @@ public:
   KV_NumericalType* getInt8() { return types->getInt8(); }
   // The void type of the run.
   KV_DataType* getVoid() { return types->demandVoidType(); }
+  // The undefined type of the run (KV_VoidType::isUndefinedType), distinct from void.
+  KV_DataType* getUndefinedType() { return types->demandUndefinedType(); }
   // The base type of that name; null for a null name or one that names no base type.
   KV_DataType* getBase(const WmCXString* name) {
     return name ? types->demandBaseType(*name) : nullptr;

@@ -23,6 +23,13 @@ const KV_DataType* endOfBaseChain(const KV_DataType* type) {
 }
 } // namespace
 
+KV_DataType* KV_DataType::getSourceType() {
+  KV_DataType* type = this;
+  while (KV_DataType* base = type->getBaseType())
+    type = base;
+  return type;
+}
+
 bool KV_DataType::isSameType(KV_DataType* other) const {
   return other && endOfBaseChain(this) == endOfBaseChain(other);
 }
@@ -95,7 +102,14 @@ bool KV_PointerType::hasEqualStructure(const KV_DataType& other) const {
 }
 
 void KV_StructType::addComponent(const WmCXString& componentName, KV_DataType* type) {
-  components.push_back(Component{componentName, type});
+  components.emplace_back(componentName, type);
+}
+
+KV_ComponentDeclaration* KV_StructType::getComponent(const WmCXString& componentName) {
+  for (Component& c : components)
+    if (c.name == componentName)
+      return &c;
+  return nullptr;
 }
 
 KV_DataType* KV_StructType::findComponentType(const WmCXString& componentName) const {

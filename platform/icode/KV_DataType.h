@@ -28,6 +28,7 @@
 #include "platform/support/WmCXString.h"
 
 #include <cstdint>
+#include <deque>
 #include <memory>
 #include <vector>
 
@@ -38,6 +39,7 @@ class KV_StructType;
 class KvCExprLocDB;
 class KvCIcFileId;
 class KvCSrcRef;
+class KvCUnparamSymbol;
 
 enum tagKvEDataTypeKind {
   KV_TYPE_VOID,
@@ -83,6 +85,10 @@ public:
   // The type this named type is made from, or null for a type that is not made from
   // another (base types among them).
   virtual KV_DataType* getBaseType() const { return naming.base; }
+  // The type a derived (named) type is defined from, at the end of its base-type chain;
+  // the type itself for a type that is not made from another (structures, arrays, base
+  // types). Never null.
+  KV_DataType* getSourceType();
   // Whether both are the same type once each is followed through its base types to the
   // end of the chain. False for null.
   virtual bool isSameType(KV_DataType* other) const;
@@ -140,12 +146,24 @@ private:
   bool useNameForCasts = false;
 };
 
+// Void, and the undefined type: the type of an object whose type the code generator does not
+// fix (the arguments of a macro call, which the preprocessor pastes as text). The undefined
+// type is of the void kind, but a type of its own, distinct from void.
 class HUL_PLATFORM_API KV_VoidType : public KV_DataType {
 public:
-  KV_VoidType(int id, WmCXString typeName) : KV_DataType(id, KV_TYPE_VOID, std::move(typeName)) {}
+  KV_VoidType(int id, WmCXString typeName, bool undefinedType = false)
+      : KV_DataType(id, KV_TYPE_VOID, std::move(typeName)), undefined(undefinedType) {}
+
+  bool isUndefinedType() const { return undefined; }
 
 protected:
-  bool hasEqualStructure(const KV_DataType&) const override { return true; }
+  // Void equals void; the undefined type only itself.
+  bool hasEqualStructure(const KV_DataType& other) const override {
+    return !undefined && !static_cast<const KV_VoidType&>(other).undefined;
+  }
+
+private:
+  bool undefined;
 };
 
 class HUL_PLATFORM_API KV_NumericalType : public KV_DataType {
@@ -214,12 +232,31 @@ private:
   bool pointerToConst;
 };
 
+// The declaration of one component in a structure type: its name, its type and the
+// symbol that declares it (a free component symbol carrying the specifiers written in the
+// declaration: const, volatile, address qualifier), or null when none was made
+// (KV_SymbolDB::demandComponentDeclSymbol makes it). Owned by its structure type; its
+// address stays the same for the type's life.
+class HUL_PLATFORM_API KV_ComponentDeclaration {
+public:
+  KV_ComponentDeclaration(WmCXString componentName, KV_DataType* componentType)
+      : name(std::move(componentName)), type(componentType) {}
+
+  const WmCXString& getName() const { return name; }
+  KV_DataType* getType() const { return type; }
+  KvCUnparamSymbol* getComponentSymbol() const { return symbol; }
+  void setComponentSymbol(KvCUnparamSymbol* declaring) { symbol = declaring; }
+
+  WmCXString name;
+  KV_DataType* type;
+
+private:
+  KvCUnparamSymbol* symbol = nullptr;
+};
+
 class HUL_PLATFORM_API KV_StructType : public KV_DataType {
 public:
-  struct Component {
-    WmCXString name;
-    KV_DataType* type;
-  };
+  using Component = KV_ComponentDeclaration;
 
   KV_StructType(int id, WmCXString typeName)
       : KV_DataType(id, KV_TYPE_STRUCT, std::move(typeName)) {}
@@ -228,6 +265,9 @@ public:
   void addComponent(const WmCXString& componentName, KV_DataType* type);
   int getNumberOfComponents() const { return static_cast<int>(components.size()); }
   const Component& getComponent(int i) const { return components[static_cast<std::size_t>(i)]; }
+  Component& getComponent(int i) { return components[static_cast<std::size_t>(i)]; }
+  // The declaration of the named component, or null. O(components).
+  KV_ComponentDeclaration* getComponent(const WmCXString& componentName);
   // The type of the named component, or null.
   KV_DataType* findComponentType(const WmCXString& componentName) const;
 
@@ -236,7 +276,8 @@ protected:
   bool hasEqualStructure(const KV_DataType&) const override { return false; }
 
 private:
-  std::vector<Component> components;
+  // A deque: declarations keep their addresses as components are added.
+  std::deque<Component> components;
 };
 
 class HUL_PLATFORM_API KV_ArrayType : public KV_DataType {

@@ -50,6 +50,12 @@ KV_VoidType* KV_DataTypeServer::demandVoidType() {
   return voidType;
 }
 
+KV_VoidType* KV_DataTypeServer::demandUndefinedType() {
+  if (!undefinedType)
+    undefinedType = adopt(std::make_unique<KV_VoidType>(getNumberOfTypes(), "undefined", true));
+  return undefinedType;
+}
+
 KV_PointerType* KV_DataTypeServer::demandPointerType(KV_DataType* target, bool toConst) {
   if (!target)
     return nullptr;

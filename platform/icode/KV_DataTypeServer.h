@@ -40,6 +40,9 @@ public:
   KV_NumericalType* demandNumericalType(const WmCXString& name, int bits, bool isSigned,
                                         bool isFloat);
   KV_VoidType* demandVoidType();
+  // The undefined type of the run (see KV_VoidType), made on first demand. It has no name
+  // in the type name space: findType never answers it.
+  KV_VoidType* demandUndefinedType();
   KV_PointerType* demandPointerType(KV_DataType* target, bool toConst);
   KV_ArrayType* demandArrayType(KV_DataType* element, int size);
   KV_StructType* demandStructType(const WmCXString& name);
@@ -110,6 +113,7 @@ private:
   std::map<std::pair<KV_DataType*, bool>, KV_PointerType*> pointers;
   std::map<std::pair<KV_DataType*, int>, KV_ArrayType*> arrays;
   KV_VoidType* voidType = nullptr;
+  KV_VoidType* undefinedType = nullptr;
   std::unique_ptr<KV_PointerTypeServer> pointerServer;
 };
 

@@ -16,6 +16,9 @@ class KvCSmbInitValExpr;
 class KvCStringExpr;
 class KvCSymbol;
 
+// How createSymbolExprLoc accesses its symbol: plainly (0) or through the pointer it holds.
+enum tagKvESymbolAccessFlag : unsigned int { KV_ACCESS_PLAIN = 0u, KV_ACCESS_DEREFERENCED = 1u };
+
 class HUL_PLATFORM_API KV_ExprLocFactory {
 public:
   explicit KV_ExprLocFactory(KvCCodeViewData* owner) : codeViewData(owner) {}
@@ -39,6 +42,14 @@ public:
   KV_ExprLocation* createFromName(const WmCXString& name, bool cook, const KvCSrcRef* srcRef);
   KV_ExprLocation* createFromValue(std::int64_t value, const KvCSrcRef* srcRef);
   KV_ExprLocation* createFromOperation(KV_Operation* op, const KvCSrcRef* srcRef);
+
+  // The forms the servers of generated interfaces use. createSymbolExprLoc: a location
+  // holding a new access to `symbol`, with the tagKvESymbolAccessFlag bits `accessFlags`
+  // (0: a plain access, printed as the symbol's name); null for a null symbol.
+  // createOperationExprLoc: a location holding `op`; null for a null operation or one that
+  // a location holds already.
+  KV_ExprLocation* createSymbolExprLoc(KvCSymbol* symbol, unsigned int accessFlags);
+  KV_ExprLocation* createOperationExprLoc(KV_Operation* op);
 
   KV_Constant* createConstant(tagKvEConstantType type, std::int64_t value, KV_DataType* dt);
   KV_Constant* createDoubleConstant(double value, KV_DataType* dt);

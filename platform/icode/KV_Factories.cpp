@@ -5,6 +5,7 @@
 #include "platform/icode/KV_ExprLocation.h"
 #include "platform/icode/KV_QualifiedSymbolOp.h"
 #include "platform/icode/KV_Statement.h"
+#include "platform/icode/KV_SymbolServer.h"
 #include "platform/icode/KvCCStmTable.h"
 #include "platform/icode/KvCCallOperation.h"
 #include "platform/icode/KvCCodeBlockOperation.h"
@@ -17,8 +18,8 @@
 
 KV_ICodeFactoryContainer::KV_ICodeFactoryContainer(KvCCodeViewData* owner)
     : codeViewData(owner), locations(owner), operations(owner), qsos(owner), statements(owner),
-      qsoFactories(owner),
-      cgsSupporter(owner), macroSymbols(&cgsSupporter, &varClasses) {}
+      qsoFactories(owner), operationFactories(owner), cgsSupporter(owner),
+      macroSymbols(owner, &cgsSupporter, &varClasses) {}
 
 KV_DataTypeServer* KV_ICodeFactoryContainer::getDataTypeServer() const {
   return codeViewData->getDataTypeServer();
@@ -43,6 +44,10 @@ KvCSmbClassServer* KV_ICodeFactoryContainer::getSmbClassServer() const {
   return codeViewData->getSmbClassServer();
 }
 
+KV_MacroSymbolServer* KV_SymbolServer::getMacro() const {
+  return codeViewData->getFactoryContainer()->getMacroSymbolServer();
+}
+
 // --- locations and what they hold
 
 KV_ExprLocation* KV_ExprLocFactory::createEmpty() {
@@ -65,6 +70,20 @@ KV_ExprLocation* KV_ExprLocFactory::createFromSymbol(KvCSymbol* symbol) {
   KV_QualifiedSymbolOp* qso =
       codeViewData->getFactoryContainer()->getQSOFactory()->createQso(symbol);
   return qso ? createFromExpression(qso) : nullptr;
+}
+
+KV_ExprLocation* KV_ExprLocFactory::createSymbolExprLoc(KvCSymbol* symbol,
+                                                        unsigned int accessFlags) {
+  KV_QualifiedSymbolOp* qso =
+      codeViewData->getFactoryContainer()->getQSOFactory()->createQso(symbol);
+  if (!qso)
+    return nullptr;
+  qso->setDereferenced((accessFlags & KV_ACCESS_DEREFERENCED) != 0);
+  return createFromExpression(qso);
+}
+
+KV_ExprLocation* KV_ExprLocFactory::createOperationExprLoc(KV_Operation* op) {
+  return createFromExpression(op);
 }
 
 KV_ExprLocation* KV_ExprLocFactory::createFromValue(std::int64_t value, KV_DataType* type,

@@ -10,6 +10,14 @@ KvCParamSymbol* KV_FunctionCallInserter::demandFunctionSymbol(
     const WmCXString& name, KV_DataType* returnType, KV_Scaling* returnScaling, int n,
     KV_ParamAccess** accesses, KV_DataType** types, KV_Scaling** scalings, KvCIcFileId* file,
     const KvCSrcRef* srcRef, bool mustBeNew) {
+  return demandFunctionSymbol(name, returnType, returnScaling, n, accesses, types, scalings,
+                              nullptr, file, srcRef, mustBeNew);
+}
+
+KvCParamSymbol* KV_FunctionCallInserter::demandFunctionSymbol(
+    const WmCXString& name, KV_DataType* returnType, KV_Scaling* returnScaling, int n,
+    KV_ParamAccess** accesses, KV_DataType** types, KV_Scaling** scalings, KvCFcnClassId* fcnClass,
+    KvCIcFileId* file, const KvCSrcRef* srcRef, bool mustBeNew) {
   if (!factories || !file || n < 0 || (n > 0 && (!accesses || !types || !scalings)))
     return nullptr;
   KV_FunctionSymbolServer* functions = factories->getSymbolServer()->getFunction();
@@ -28,8 +36,8 @@ KvCParamSymbol* KV_FunctionCallInserter::demandFunctionSymbol(
     nameTable[i] = "p" + WmCXString(i, false, false);
     flags[static_cast<std::size_t>(i)] = accesses[i]->getFlagWord();
   }
-  KvCFcnClassId* fcnClass =
-      factories->getSmbClassServer()->getFcnClassServer()->demandFcnClass(srcRef);
+  if (!fcnClass)
+    fcnClass = factories->getSmbClassServer()->getFcnClassServer()->demandFcnClass(srcRef);
   bool created = false;
   return functions->demand(table, name, 0u, returnType, returnScaling, typeTable, scalingTable,
                            nameTable, flags.data(), fcnClass, &created, srcRef);

@@ -6,9 +6,11 @@
 #include "platform/icode/KV_CgsSupporter.h"
 #include "platform/icode/KV_ExprLocFactory.h"
 #include "platform/icode/KV_MacroSymbolServer.h"
+#include "platform/icode/KV_OperationFactories.h"
 #include "platform/icode/KV_OperationFactory.h"
 #include "platform/icode/KV_QSOFactories.h"
 #include "platform/icode/KV_QSOFactory.h"
+#include "platform/icode/KV_RangeServer.h"
 #include "platform/icode/KV_StatementFactory.h"
 #include "platform/icode/KvCVarClassServer.h"
 
@@ -46,6 +48,9 @@ public:
   KV_SymbolServer* getSymbolServer() const;
   KvCSmbClassServer* getSmbClassServer() const;
   KV_QSOFactories* getQSOFactories() { return &qsoFactories; }
+  // The factories of preprocessor concatenations and string appends, and the range server.
+  KV_OperationFactories* getOperationFactories() { return &operationFactories; }
+  KV_RangeServer* getRangeServer() { return &ranges; }
 
 private:
   KvCCodeViewData* codeViewData;
@@ -54,6 +59,8 @@ private:
   KV_QSOFactory qsos;
   KV_StatementFactory statements;
   KV_QSOFactories qsoFactories;
+  KV_OperationFactories operationFactories;
+  KV_RangeServer ranges;
   KvCVarClassServer varClasses;
   KV_CgsSupporter cgsSupporter;
   KV_MacroSymbolServer macroSymbols; // after the two it uses

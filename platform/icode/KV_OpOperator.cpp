@@ -82,6 +82,8 @@ constexpr KindInfo kInfo[KV_OP_NUMBER_OF_KINDS] = {
     {"TypeDefinition", -1, Access::DeclaresFirst},
     {"StaticDeclDef", -1, Access::DeclaresFirst},
     {"CodeBlock", -1, Access::UseAll},
+    {"PreProcConcat", 2, Access::UseAll},
+    {"StringAppend", 2, Access::UseAll},
 };
 
 bool inRange(tagKvEOperatorKind kind, tagKvEOperatorKind first, tagKvEOperatorKind last) {

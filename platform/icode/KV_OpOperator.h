@@ -88,6 +88,10 @@ enum tagKvEOperatorKind {
   KV_OP_STATIC_DECLDEF,
   // code blocks (custom code, assembler)
   KV_OP_CODE_BLOCK,
+  // preprocessor text of macro bodies: the concatenation of two pieces (`##` where it pastes
+  // names, KvCPreProcOpFactory) and an expression followed by a text (KvCAppendOpFactory)
+  KV_OP_PREPROC_CONCAT,
+  KV_OP_STRING_APPEND,
   KV_OP_NUMBER_OF_KINDS
 };
 
@@ -142,6 +146,8 @@ public:
   bool isBinaryIndexOperator() const;
   bool isPreProcControlFlow() const { return kind == KV_OP_PREPROC_IF; }
   bool isCodeBlock() const { return kind == KV_OP_CODE_BLOCK; }
+  bool isPreProcConcat() const { return kind == KV_OP_PREPROC_CONCAT; }
+  bool isStringAppend() const { return kind == KV_OP_STRING_APPEND; }
   // Any declaration or definition kind (operand 0 is the declared object).
   bool isDeclOrDef() const;
   bool isStaticDeclDef() const { return kind == KV_OP_STATIC_DECLDEF; }

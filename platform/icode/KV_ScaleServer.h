@@ -26,11 +26,13 @@ public:
   KV_Scaling* getAdaptiveScaling() { return &adaptive; }
   KV_Scaling* getDefaultScaling() { return &defaultScaling; }
   KV_Scaling* getDefaultVoidScaling() { return &defaultVoid; }
+  KV_Scaling* getUndefinedScaling() { return &undefined; }
 
 private:
   KV_Scaling adaptive{1.0, 0.0, KV_SCALING_ADAPTIVE};
   KV_Scaling defaultScaling{1.0, 0.0, KV_SCALING_DEFAULT};
   KV_Scaling defaultVoid{1.0, 0.0, KV_SCALING_DEFAULT_VOID};
+  KV_Scaling undefined{1.0, 0.0, KV_SCALING_UNDEFINED};
   std::map<std::pair<double, double>, std::unique_ptr<KV_Scaling>> scalings;
 };
 

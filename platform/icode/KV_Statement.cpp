@@ -5,6 +5,8 @@
 
 KV_ICodeElem* KV_Statement::getParentElem() const { return parentTable; }
 
+KV_ICodeElem* KV_StatementTable::getParentElem() const { return parentStatement; }
+
 bool KV_Statement::setExprLoc(KV_ExprLocation* loc) {
   if (loc == root)
     return true;
@@ -55,25 +57,4 @@ bool KV_StatementTable::appendStatement(KV_Statement* statement) {
 
 KV_StatementTable* KV_StatementTable::getParentTable() const {
   return parentStatement ? parentStatement->getParentTable() : nullptr;
-}
-
-KvCCStmTable::~KvCCStmTable() = default;
-
-const KvCCStmTable* KvCCStmTable::enclosingCTable() const {
-  KV_StatementTable* outer = getParentTable();
-  return outer ? outer->getCTable() : nullptr;
-}
-
-KvCParamSymbol* KvCCStmTable::getCodeBlockSymbol() const {
-  for (const KvCCStmTable* t = this; t; t = t->enclosingCTable())
-    if (t->codeBlockSymbol)
-      return t->codeBlockSymbol;
-  return nullptr;
-}
-
-KvCIcFileId* KvCCStmTable::getFile() const {
-  for (const KvCCStmTable* t = this; t; t = t->enclosingCTable())
-    if (t->fileId)
-      return t->fileId;
-  return nullptr;
 }

@@ -14,7 +14,7 @@ class KvCRtosProtection;
 class HUL_PLATFORM_API KV_StatementTable : public KV_ICodeElem {
 public:
   KV_StatementTable* asStatementTable() override { return this; }
-  KV_ICodeElem* getParentElem() const override { return parentStatement; }
+  KV_ICodeElem* getParentElem() const override;
 
   // The table's own number of statements (nested tables not counted).
   int getNumberOfStatements() const { return static_cast<int>(statements.size()); }

@@ -36,8 +36,7 @@ KvCUnparamSymbol* KV_SymbolDB::createUnparamSymbol(const WmCXString& name, KV_Da
 }
 
 KvCUnparamSymbol* KV_SymbolDB::demandComponentSymbol(KvCUnparamSymbol* structSymbol, int i) {
-  KV_DataType* type = structSymbol ? structSymbol->getDataType() : nullptr;
-  KV_StructType* structType = type ? type->asStructType() : nullptr;
+  KV_StructType* structType = structSymbol ? structSymbol->getSlotStructType() : nullptr;
   if (!structType || i < 0 || i >= structType->getNumberOfComponents())
     return nullptr;
   if (KvCUnparamSymbol* existing = structSymbol->getComponentSymbol(i))
@@ -54,6 +53,22 @@ KvCUnparamSymbol* KV_SymbolDB::demandComponentSymbol(KvCUnparamSymbol* structSym
       static_cast<std::size_t>(structType->getNumberOfComponents()), nullptr);
   structSymbol->componentSymbols[static_cast<std::size_t>(i)] = component;
   return component;
+}
+
+KvCUnparamSymbol* KV_SymbolDB::demandComponentDeclSymbol(KV_StructType* structType,
+                                                         const WmCXString& componentName) {
+  KV_ComponentDeclaration* declaration =
+      structType ? structType->getComponent(componentName) : nullptr;
+  if (!declaration)
+    return nullptr;
+  if (KvCUnparamSymbol* existing = declaration->getComponentSymbol())
+    return existing;
+  auto made = std::make_unique<KvCUnparamSymbol>(getNumberOfSymbols() + 1, declaration->name,
+                                                 declaration->type, true);
+  KvCUnparamSymbol* symbol = made.get();
+  symbols.push_back(std::move(made));
+  declaration->setComponentSymbol(symbol);
+  return symbol;
 }
 
 KvCSymbol* KV_SymbolDB::findSymbol(const WmCXString& name) const {

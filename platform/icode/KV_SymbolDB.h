@@ -13,6 +13,7 @@
 #include <vector>
 
 class KV_DataType;
+class KV_StructType;
 
 class HUL_PLATFORM_API KV_SymbolDB {
 public:
@@ -23,11 +24,18 @@ public:
 
   KvCParamSymbol* createParamSymbol(const WmCXString& name, KV_DataType* returnType, bool macro);
   KvCUnparamSymbol* createUnparamSymbol(const WmCXString& name, KV_DataType* type, bool component);
-  // The component symbol of slot `i` of the structure instance `structSymbol`, named and
-  // typed after component i of its structure type; made (and joined to the instance) when
-  // missing. Null when the symbol is not a structure instance or has no slot i. Such
-  // components are numbered like every symbol but not found by name (findSymbol).
+  // The component symbol of slot `i` of the structure instance (or array of structures)
+  // `structSymbol`, named and typed after component i of its structure type (the array's
+  // element structure); made (and joined to the instance) when missing. Null when the
+  // symbol has no slots or no slot i. Such components are numbered like every symbol but
+  // not found by name (findSymbol).
   KvCUnparamSymbol* demandComponentSymbol(KvCUnparamSymbol* structSymbol, int i);
+  // The symbol that declares component `componentName` of `structType` (a free component
+  // symbol named and typed after the component, held by the type's component
+  // declaration), made when missing. Null when the type has no such component. Numbered
+  // like every symbol, not found by name.
+  KvCUnparamSymbol* demandComponentDeclSymbol(KV_StructType* structType,
+                                              const WmCXString& componentName);
 
   KvCSymbol* findSymbol(const WmCXString& name) const;
   int getNumberOfSymbols() const { return static_cast<int>(symbols.size()); }

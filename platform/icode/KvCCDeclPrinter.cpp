@@ -1,5 +1,6 @@
 #include "platform/icode/KvCCDeclPrinter.h"
 
+#include "platform/icode/KV_Constant.h"
 #include "platform/icode/KV_DataType.h"
 #include "platform/icode/KV_ExprLocation.h"
 #include "platform/icode/KV_Operation.h"
@@ -8,9 +9,13 @@
 #include "platform/icode/KvCCStmTable.h"
 #include "platform/icode/KvCIcFileId.h"
 #include "platform/icode/KvCParamSymbol.h"
+#include "platform/icode/KvCStringExpr.h"
 #include "platform/icode/KvCSymbol.h"
+#include "platform/icode/KvCUnparamSymbol.h"
 
 #include <cctype>
+#include <cstdint>
+#include <sstream>
 
 namespace {
 std::string dimensionSuffix(const KV_DimensionDescriptor& dims) {
@@ -28,6 +33,38 @@ std::string join(const std::string& specifier, const std::string& inner) {
     return specifier + inner;
   std::string rest = inner.substr(stars);
   return specifier + inner.substr(0, stars) + " " + rest;
+}
+
+bool isIdentifierChar(char c) {
+  auto u = static_cast<unsigned char>(c);
+  return std::isalnum(u) || c == '_';
+}
+
+// The two pieces of a preprocessor concatenation: pasted with `##` where both meet with
+// identifier characters, side by side otherwise.
+std::string concatenation(const std::string& left, const std::string& right) {
+  if (!left.empty() && !right.empty() && isIdentifierChar(left.back()) &&
+      isIdentifierChar(right.front()))
+    return left + "##" + right;
+  return left + right;
+}
+
+// The symbol a location accesses, or null.
+KvCSymbol* accessedSymbol(const KV_ExprLocation* location) {
+  KvCIcExpression* access = location ? location->getExpression() : nullptr;
+  KV_QualifiedSymbolOp* qso = access ? access->asQualifiedSymbolOp() : nullptr;
+  return qso ? qso->getSymbol() : nullptr;
+}
+
+std::string constantText(KV_Constant* constant) {
+  if (constant->getConstantType() == KV_CONST_DOUBLE) {
+    std::ostringstream text;
+    text << constant->getDoubleValue();
+    return text.str();
+  }
+  if (constant->getConstantType() == KV_CONST_UNSIGNED)
+    return std::to_string(static_cast<std::uint64_t>(constant->getIntValue())) + "u";
+  return std::to_string(constant->getIntValue());
 }
 } // namespace
 
@@ -133,6 +170,88 @@ WmCXString KvCCDeclPrinter::printStatement(const KV_Statement* statement) const 
   }
   case KV_OP_FUNCTION_DECLARATION:
     return printPrototype(op);
+  case KV_OP_MACRO_DEFINITION:
+    return printMacroDefinition(op);
+  default:
+    return {};
+  }
+}
+
+bool KvCCDeclPrinter::isPreIncludeDefinition(const KV_Statement* statement) {
+  KV_ExprLocation* root = statement ? statement->getExprLoc() : nullptr;
+  KV_Operation* op = root ? root->getOperation() : nullptr;
+  if (!op || op->getOperator()->getKind() != KV_OP_MACRO_DEFINITION)
+    return false;
+  KvCSymbol* symbol = accessedSymbol(op->getOperand(0));
+  KvCParamSymbol* macro = symbol ? symbol->asParamSymbol() : nullptr;
+  return macro && macro->isPreIncludeMacro();
+}
+
+WmCXString KvCCDeclPrinter::printMacroDefinition(const KV_Operation* definition) const {
+  KvCSymbol* symbol = accessedSymbol(definition->getOperand(0));
+  if (!symbol)
+    return {};
+  if (KvCParamSymbol* macro = symbol->asParamSymbol()) {
+    // (macro, body, file)
+    if (!macro->isMacro())
+      return {};
+    std::string parameters;
+    for (int i = 0; i < macro->getNumberOfFormalParams(); ++i)
+      parameters += (i > 0 ? ", " : "") + macro->getFormalParam(i).name.str();
+    const std::string body = expressionText(definition->getOperand(1));
+    return "#define " + macro->getName().str() + "(" + parameters + ")" +
+           (body.empty() ? "" : " " + body) + "\n";
+  }
+  // A global macro: (macro, type, file, value).
+  KvCUnparamSymbol* global = symbol->asUnparamSymbol();
+  if (!global || !global->isGlobalMacro())
+    return {};
+  const std::string value = expressionText(definition->getOperand(3));
+  if (value.empty())
+    return "#define " + global->getName().str() + "\n";
+  KV_ExprLocation* typeLoc = definition->getOperand(1);
+  KV_DataType* type =
+      typeLoc && typeLoc->getDataTypeRef() ? typeLoc->getDataTypeRef() : global->getDataType();
+  const bool byName = type && type->isUseNameForCasts() && isVisible(type);
+  const std::string cast = byName ? type->getName().str() : declarator(type, "", false);
+  return "#define " + global->getName().str() + " ((" + cast + ")" + value + ")\n";
+}
+
+WmCXString KvCCDeclPrinter::printExpression(const KV_ExprLocation* location) const {
+  return expressionText(location);
+}
+
+std::string KvCCDeclPrinter::expressionText(const KV_ExprLocation* location) const {
+  KvCIcExpression* expression = location ? location->getExpression() : nullptr;
+  if (!expression)
+    return {};
+  if (KvCStringExpr* string = expression->asStringExpr())
+    return string->applyQuotes() ? "\"" + string->getString().str() + "\""
+                                 : string->getString().str();
+  if (KV_Constant* constant = expression->asConstant())
+    return constantText(constant);
+  KV_Operation* op = expression->asOperation();
+  if (!op)
+    return {};
+  if (KV_QualifiedSymbolOp* qso = op->asQualifiedSymbolOp())
+    return (qso->isDereferenced() ? "*" : "") + qso->getSymbol()->getName().str();
+  switch (op->getOperator()->getKind()) {
+  case KV_OP_CALL: {
+    // (called, parameters...): the actual of each parameter operation.
+    std::string text = expressionText(op->getOperand(0)) + "(";
+    for (int i = 1; i < op->getNumberOfOperands(); ++i) {
+      KV_ExprLocation* argument = op->getOperand(i);
+      KV_Operation* parameter = argument ? argument->getOperation() : nullptr;
+      if (parameter && parameter->getOperator()->isParameter())
+        argument = parameter->getOperand(1);
+      text += (i > 1 ? ", " : "") + expressionText(argument);
+    }
+    return text + ")";
+  }
+  case KV_OP_PREPROC_CONCAT:
+    return concatenation(expressionText(op->getOperand(0)), expressionText(op->getOperand(1)));
+  case KV_OP_STRING_APPEND:
+    return expressionText(op->getOperand(0)) + expressionText(op->getOperand(1));
   default:
     return {};
   }
@@ -166,14 +285,22 @@ WmCXString KvCCDeclPrinter::printFile(const KvCIcFileId* file) {
   KvCCDeclPrinter printer;
   WmCXString guard = getIncludeGuard(file->getName());
   WmCXString text = "#ifndef " + guard + "\n#define " + guard + "\n";
+  const KvCCStmTable* table = file->getFile()->getStatementTable();
+  const int nStatements = table ? table->getNumberOfStatements() : 0;
+  WmCXString preIncludes;
+  for (int i = 0; i < nStatements; ++i)
+    if (isPreIncludeDefinition(table->getStatement(i)))
+      preIncludes += printer.printStatement(table->getStatement(i));
+  if (!preIncludes.isEmpty())
+    text += "\n" + preIncludes;
   WmCXString typedefs;
   for (KV_DataType* type : file->getFile()->getDefinedTypes())
     typedefs += printer.printTypeDefinition(type);
   if (!typedefs.isEmpty())
     text += "\n" + typedefs;
   WmCXString declarations;
-  if (const KvCCStmTable* table = file->getFile()->getStatementTable())
-    for (int i = 0; i < table->getNumberOfStatements(); ++i)
+  for (int i = 0; i < nStatements; ++i)
+    if (!isPreIncludeDefinition(table->getStatement(i)))
       declarations += printer.printStatement(table->getStatement(i));
   if (!declarations.isEmpty())
     text += "\n" + declarations;

@@ -4,7 +4,19 @@
 // (`extern StatusType status;`) and the prototypes of the functions declared there that
 // carry a signature (`StatusType SetEvent(TaskType taskId, EventMaskType mask);`, `void
 // Schedule(void);`). Functions without a signature (made other than by the function symbol
-// server or the call inserter) and macros print nothing yet.
+// server or the call inserter) print nothing.
+//
+// Macros: the macro definitions of the table print as `#define` lines. A function-like
+// macro prints with its parameter names and its body, `#define AP_CONCAT(name1, name2)
+// AP_EXPAND_CONCAT(name1, name2)`; the pre-include macros among them come first, right
+// after the include guard, before the typedefs. A global (object-like) macro prints with
+// its value cast to its type, `#define CID_Engine ((signed char)1)`, in statement order.
+// Bodies print as preprocessor text: a symbol access as the symbol's name, a code string as
+// its text, a constant as its value, a macro or function call as `NAME(arg1, arg2)` (the
+// actual of each parameter operation), a string append as its expression followed by its
+// text, and a preprocessor concatenation as its two pieces joined by `##` where both meet
+// with identifier characters (so the preprocessor pastes two names) and side by side
+// elsewhere (a bracket and a name: `(name)`).
 //
 // Every printed file is valid C99 on its own: it includes nothing. A type is written by
 // its name only where the name is visible, that is after its typedef in the same file;
@@ -24,6 +36,7 @@
 #include <unordered_set>
 
 class KV_DataType;
+class KV_ExprLocation;
 class KV_Operation;
 class KV_Statement;
 class KvCIcFileId;
@@ -50,8 +63,16 @@ public:
   // The C text of a statement of a file's top-level table, ending with a newline; empty
   // for a statement that declares nothing this printer writes.
   WmCXString printStatement(const KV_Statement* statement) const;
+  // The preprocessor text of an expression (see above); empty for a null or empty
+  // location and for operations this printer does not write.
+  WmCXString printExpression(const KV_ExprLocation* location) const;
+  // Whether the statement defines a pre-include macro (printed before the typedefs).
+  static bool isPreIncludeDefinition(const KV_Statement* statement);
 
 private:
+  // `#define` line of a macro definition; empty when it defines no macro.
+  WmCXString printMacroDefinition(const KV_Operation* definition) const;
+  std::string expressionText(const KV_ExprLocation* location) const;
   // The prototype of a function declaration; empty when it has no signature.
   WmCXString printPrototype(const KV_Operation* declaration) const;
   bool isVisible(const KV_DataType* type) const { return visible.count(type) != 0; }

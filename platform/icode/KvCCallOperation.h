@@ -3,8 +3,9 @@
 // are the parameter operations (formal, actual).
 //
 // The calling function is not stored: it is the code block symbol of the statement table
-// that contains the call, found on demand (null for a call outside every function, for
-// example in an initial value at file level). The answer is kept with the structure
+// that contains the call, or, for a call in the body of a macro definition, that macro;
+// found on demand (null for a call outside every function and macro body, for example in
+// an initial value at file level). The answer is kept with the structure
 // epoch it was found at (see KV_ICodeElem) and reused while no link of the ICode changed.
 #ifndef HUL_PLATFORM_ICODE_KVCCALLOPERATION_H
 #define HUL_PLATFORM_ICODE_KVCCALLOPERATION_H

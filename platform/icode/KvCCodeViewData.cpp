@@ -8,6 +8,7 @@
 #include "platform/icode/KV_ScaleServer.h"
 #include "platform/icode/KV_SymbolDB.h"
 #include "platform/icode/KV_SymbolServer.h"
+#include "platform/icode/KvCAddressQualifier.h"
 #include "platform/icode/KvCApplicationServer.h"
 #include "platform/icode/KvCExprLocDB.h"
 #include "platform/icode/KvCExprLocDBServer.h"
@@ -48,7 +49,7 @@ KvCCodeViewData::KvCCodeViewData(const WmCXString& applicationName)
       dbServer(std::make_unique<KvCExprLocDBServer>(this)),
       factories(std::make_unique<KV_ICodeFactoryContainer>(this)),
       symbolServer(std::make_unique<KV_SymbolServer>(this)),
-      smbClassServer(std::make_unique<KvCSmbClassServer>()),
+      smbClassServer(std::make_unique<KvCSmbClassServer>(factories->getVarClassServer())),
       templateServer(std::make_unique<KvCTemplateServer>()),
       applServer(std::make_unique<KvCApplicationServer>(this)) {
   typeServer->setSymbolDB(symbolDB.get());
@@ -117,6 +118,17 @@ KvCRtosProtection* KvCCodeViewData::createRtosProtection(const WmCXString& resou
 KvCNameSpace* KvCCodeViewData::createNameSpace() {
   nameSpaces.push_back(std::make_unique<KvCNameSpace>());
   return nameSpaces.back().get();
+}
+
+KvCAddressQualifier* KvCCodeViewData::demandAddressQualifier(const WmCXString& name,
+                                                             bool isDefault) {
+  if (name.isEmpty())
+    return nullptr;
+  for (const auto& qualifier : addressQualifiers)
+    if (qualifier->getName() == name)
+      return qualifier.get();
+  addressQualifiers.push_back(std::make_unique<KvCAddressQualifier>(name, isDefault));
+  return addressQualifiers.back().get();
 }
 
 KvCExprLocDB* KvCExprLocDBServer::demandExprLocDB(KV_DataType* type) {

@@ -19,6 +19,7 @@
 #include <vector>
 
 class KV_BaseTypeServer;
+class KvCAddressQualifier;
 class KV_DataTypeServer;
 class KV_ICodeElem;
 class KV_ICodeFactoryContainer;
@@ -80,6 +81,9 @@ public:
   KvCTaskActivation* createTaskActivation(int kind, const WmCXString& taskName);
   KvCRtosProtection* createRtosProtection(const WmCXString& resourceName);
   KvCNameSpace* createNameSpace();
+  // The address qualifier of that name, made on first demand; `isDefault` only applies to
+  // a new qualifier (a qualifier keeps what it was made with). Null for an empty name.
+  KvCAddressQualifier* demandAddressQualifier(const WmCXString& name, bool isDefault);
 
   // Makes a new element of type T, numbered with the next serial number (its first
   // constructor argument) and owned here. Elements live in large blocks in creation
@@ -109,6 +113,7 @@ private:
   std::vector<std::unique_ptr<KvCTaskActivation>> taskActivations;
   std::vector<std::unique_ptr<KvCRtosProtection>> protections;
   std::vector<std::unique_ptr<KvCNameSpace>> nameSpaces;
+  std::vector<std::unique_ptr<KvCAddressQualifier>> addressQualifiers;
   std::unique_ptr<KV_OpConversionLevel> levels[KV_CONV_NUMBER_OF_LEVELS];
   std::unique_ptr<KvCSrcRefServer> srcRefServer;
   std::unique_ptr<KV_DataTypeServer> typeServer;

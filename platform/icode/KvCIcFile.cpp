@@ -19,3 +19,8 @@ bool KvCIcFile::defineType(KV_DataType* type, const KvCSrcRef* /*srcRef*/, bool 
   type->moduleFile = fileId;
   return true;
 }
+
+bool KvCIcFile::isHeaderFile() const {
+  const std::string& name = fileId->getName().str();
+  return name.size() >= 2 && name.compare(name.size() - 2, 2, ".h") == 0;
+}

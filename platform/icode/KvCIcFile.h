@@ -1,7 +1,8 @@
 // KvCIcFile: the properties of one generated file: whether it is a stub or artificial,
 // its code generation basis, who is responsible for it, its top-level statement table,
-// its complementary file (the header of a source file and vice versa) and the types it
-// defines, in definition order.
+// its complementary file (the header of a source file and vice versa), its code unit and
+// the types it defines, in definition order. A file whose name ends in ".h" is a header;
+// every other file is a source file.
 //
 // A file is part of its file id (getFileId), which owns it. A type is defined in at most
 // one file, its module file; the file points to the types it defines, which the data type
@@ -16,6 +17,7 @@
 
 class KV_DataType;
 class KvCCStmTable;
+class KvCIcCodeUnit;
 class KvCIcFileId;
 class KvCSrcRef;
 
@@ -51,6 +53,10 @@ public:
   void setStatementTable(KvCCStmTable* t) { table = t; }
   KvCIcFileId* getComplementaryFile() const { return complementary; }
   void setComplementaryFile(KvCIcFileId* file) { complementary = file; }
+  // The code unit the file was added to (KvCIcCodeUnit::addFile), or null.
+  KvCIcCodeUnit* getCodeUnit() const { return codeUnit; }
+  // Whether the file is a header (its name ends in ".h").
+  bool isHeaderFile() const;
 
   // Declares `type` in this file and makes the file the type's module file. `append`: the
   // type comes after the types defined so far, else before them (for a type that earlier
@@ -79,7 +85,10 @@ public:
   void setSourceRef(const KvCSrcRef* ref) { sourceRef = ref; }
 
 private:
+  friend class KvCIcCodeUnit; // sets the upward link
+
   KvCIcFileId* fileId;
+  KvCIcCodeUnit* codeUnit = nullptr;
   bool stub = false;
   bool artificial = false;
   tagKvECodegenBase codegenBase = KV_CODEGEN_BASE_MODEL;

@@ -20,5 +20,6 @@ bool KvCIcCodeUnit::addFile(KvCIcFileId* file) {
   if (!file || std::find(files.begin(), files.end(), file) != files.end())
     return false;
   files.push_back(file);
+  file->getFile()->codeUnit = this;
   return true;
 }

@@ -44,3 +44,12 @@ bool KvCIcFileServer::demandAcmeFiles(KvCIcFileId*& headerFile, KvCIcFileId*& cF
                                       const KvCSrcRef* /*srcRef*/) {
   return demandPair("acme.h", "acme.c", acmeFilesUnavailable, headerFile, cFile);
 }
+
+KvCIcFileId* KvCIcFileServer::demandApHeaderFile(const KvCSrcRef* /*srcRef*/) {
+  return apHeaderUnavailable ? nullptr : demandFile("ecp_ap.h");
+}
+
+bool KvCIcFileServer::demandEcuServiceFile(KvCIcFileId*& file, const KvCSrcRef* /*srcRef*/) {
+  file = ecuServiceUnavailable ? nullptr : demandFile("wmecu.h");
+  return file != nullptr;
+}

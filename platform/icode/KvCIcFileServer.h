@@ -7,6 +7,12 @@
 // complementary file; it is made on first demand and is the same pair on every demand.
 // Fixtures can make either demand fail (setRootFilesUnavailable,
 // setAcmeFilesUnavailable).
+//
+// Two single files serve the Ecp tools: the access-point header ("ecp_ap.h"), which
+// defines the access-point macros, and the ECU service file ("wmecu.h"), which declares
+// the ECU service function. Each is made on first demand and is the same file on every
+// demand; fixtures can make either demand fail (setApHeaderFileUnavailable,
+// setEcuServiceFileUnavailable).
 #ifndef HUL_PLATFORM_ICODE_KVCICFILESERVER_H
 #define HUL_PLATFORM_ICODE_KVCICFILESERVER_H
 
@@ -40,6 +46,15 @@ public:
   void setRootFilesUnavailable(bool unavailable) { rootFilesUnavailable = unavailable; }
   void setAcmeFilesUnavailable(bool unavailable) { acmeFilesUnavailable = unavailable; }
 
+  // The access-point header, or null when it is not available. `srcRef` is not kept.
+  KvCIcFileId* demandApHeaderFile(const KvCSrcRef* srcRef);
+  // The ECU service file: true with the file, or false with null when it is not
+  // available. `srcRef` is not kept.
+  bool demandEcuServiceFile(KvCIcFileId*& file, const KvCSrcRef* srcRef);
+  // Fixture switches: while set, the demand of that file fails.
+  void setApHeaderFileUnavailable(bool unavailable) { apHeaderUnavailable = unavailable; }
+  void setEcuServiceFileUnavailable(bool unavailable) { ecuServiceUnavailable = unavailable; }
+
 private:
   bool demandPair(const WmCXString& headerName, const WmCXString& cName, bool unavailable,
                   KvCIcFileId*& headerFile, KvCIcFileId*& cFile);
@@ -49,6 +64,8 @@ private:
   std::unordered_map<WmCXString, KvCIcFileId*> byName;
   bool rootFilesUnavailable = false;
   bool acmeFilesUnavailable = false;
+  bool apHeaderUnavailable = false;
+  bool ecuServiceUnavailable = false;
 };
 
 #endif

@@ -7,6 +7,12 @@
 // a type, a scaling and a flag word (hasSignature). The return type is the symbol's data
 // type, the return scaling its scaling. Symbols made otherwise have no signature.
 //
+// A macro made by the parameterised macro symbol server (or the macro call inserter) also
+// carries a signature: its parameters have names and flag words but no types or scalings
+// (null). It may be a pre-include macro: one that a file defines before everything else
+// it holds. Its body is the location that its definition statement holds as body
+// (getMacroBody; null for a macro without body in this application).
+//
 // In partitioned code a function also has roles of its own (tagKvEFunctionRole: partition
 // step/init/term/restart function, auxiliary function, RTE API call, called by the
 // simulation frame) and may point to its code block in the view (not owned; null for a
@@ -19,6 +25,7 @@
 #include <memory>
 #include <vector>
 
+class KV_ExprLocation;
 class KvCCStmTable;
 class KvCCodeBlockId;
 class KvCFcgFunctionInfo;
@@ -45,6 +52,11 @@ public:
   KvCParamSymbol* asParamSymbol() override { return this; }
 
   bool isMacro() const { return macro; }
+  bool isPreIncludeMacro() const { return preInclude; }
+  void markAsPreIncludeMacro() { preInclude = true; }
+  // The location that holds the macro's body (owned by the code view data), or null.
+  KV_ExprLocation* getMacroBody() const { return macroBody; }
+  void setMacroBody(KV_ExprLocation* body) { macroBody = body; }
   KvCCStmTable* getBodySTT() const { return body; }
   void setBodySTT(KvCCStmTable* table) { body = table; }
   KvCFcgFunctionInfo* getFunctionInfo() const { return info.get(); }
@@ -91,12 +103,18 @@ public:
     signatureSet = true;
   }
   unsigned int getSymbolFlags() const { return symbolFlags; }
+  // The function class (given with the signature, or set on its own), or null.
   KvCFcnClassId* getFcnClassId() const { return functionClass; }
+  virtual void setFcnClassId(KvCFcnClassId* fcnClass) { functionClass = fcnClass; }
+  // The symbol class of the function class, or null.
+  KvCSmbClassId* getSmbClassId() const override;
   int getNumberOfFormalParams() const { return static_cast<int>(formals.size()); }
   const FormalParam& getFormalParam(int i) const { return formals[static_cast<std::size_t>(i)]; }
 
 private:
   bool macro;
+  bool preInclude = false;
+  KV_ExprLocation* macroBody = nullptr;
   KvCCStmTable* body = nullptr;
   std::unique_ptr<KvCFcgFunctionInfo> info;
   bool signatureSet = false;

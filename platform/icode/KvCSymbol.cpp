@@ -24,6 +24,10 @@ KvCParamSymbol::KvCParamSymbol(int index, WmCXString symbolName, KV_DataType* re
 
 KvCParamSymbol::~KvCParamSymbol() = default;
 
+KvCSmbClassId* KvCParamSymbol::getSmbClassId() const {
+  return functionClass ? functionClass->getSmbClassId() : nullptr;
+}
+
 bool KvCFcgCallsBySerial::operator()(const KvCCallOperation* a, const KvCCallOperation* b) const {
   return (a ? a->getSerial() : -1) < (b ? b->getSerial() : -1);
 }

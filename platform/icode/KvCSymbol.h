@@ -7,16 +7,27 @@
 // generator sets; the predicates and marks below read and set them. A symbol is
 // "selected" unless the code generator deselects it (for example a symbol of a library
 // that is not generated).
+//
+// Class and place: a symbol's class (getSmbClassId) is the symbol class of its variable
+// class (KvCUnparamSymbol) or function class (KvCParamSymbol); it has an extended class
+// state and may carry an extern class besides (the class of its declarations in other
+// files). Its statement table (getStt) is the table it was last entered in
+// (KvCCStmTable::enterSymbol or enterDeclaration); the table's removeSymbol leaves it as
+// it is, so it still names the old table until setStt changes it. At most one table lists
+// a symbol at a time (see KvCCStmTable).
 #ifndef HUL_PLATFORM_ICODE_KVCSYMBOL_H
 #define HUL_PLATFORM_ICODE_KVCSYMBOL_H
 
 #include "platform/icode/KvCExprLocDB.h"
+#include "platform/icode/KvCSmbClass.h"
 #include "platform/support/HulPlatformExport.h"
 #include "platform/support/WmCXString.h"
 
 class KV_DataType;
 class KV_Scaling;
+class KvCCStmTable;
 class KvCParamSymbol;
+class KvCSmbClassId;
 class KvCUnparamSymbol;
 
 enum tagKvESymbolRole : unsigned {
@@ -43,6 +54,15 @@ enum tagKvESymbolRole : unsigned {
   KV_ROLE_STARTUP_FUNCTION = 1u << 20,
   KV_ROLE_AP_ENTRY_FUNCTION = 1u << 21,
   KV_ROLE_AP_EXIT_FUNCTION = 1u << 22,
+  // The Ecp tools' access-point macros (ap_Write, ap_Read, ap_Entry, ap_Exit), the ECU
+  // service function, and object-like macros of file scope (KV_MacroSymbolServer's
+  // global macros).
+  KV_ROLE_AP_WRITE_MACRO = 1u << 23,
+  KV_ROLE_AP_READ_MACRO = 1u << 24,
+  KV_ROLE_AP_ENTRY_MACRO = 1u << 25,
+  KV_ROLE_AP_EXIT_MACRO = 1u << 26,
+  KV_ROLE_ECU_SERVICE_FUNCTION = 1u << 27,
+  KV_ROLE_GLOBAL_MACRO = 1u << 28,
 };
 
 class HUL_PLATFORM_API KvCSymbol {
@@ -60,6 +80,18 @@ public:
 
   virtual KvCParamSymbol* asParamSymbol() { return nullptr; }
   virtual KvCUnparamSymbol* asUnparamSymbol() { return nullptr; }
+
+  // The symbol's class: the symbol class its variable or function class stands for; null
+  // when it has no such class (or the class stands for no symbol class).
+  virtual KvCSmbClassId* getSmbClassId() const { return nullptr; }
+  virtual tagKvESmbClassState getExtSmbClassState() const { return extClassState; }
+  virtual void setExtSmbClassState(tagKvESmbClassState state) { extClassState = state; }
+  // The class of the symbol's extern declarations in other files, or null. Not owned.
+  virtual KvCSmbClassId* getExternSmbClass() const { return externClass; }
+  virtual void setExternSmbClass(KvCSmbClassId* cls) { externClass = cls; }
+  // The statement table the symbol was last entered in, or null (never entered, or reset).
+  virtual KvCCStmTable* getStt() const { return stt; }
+  virtual void setStt(KvCCStmTable* table) { stt = table; }
 
   KvCExprLocDB* getExprLocDB() const { return &db; }
   bool isSelected() const { return selected; }
@@ -91,11 +123,27 @@ public:
   void markAsSetAbsAlarmFunction() { setRole(KV_ROLE_SET_ABS_ALARM, true); }
   void markAsSetRelAlarmFunction() { setRole(KV_ROLE_SET_REL_ALARM, true); }
   void markAsCancelAlarmFunction() { setRole(KV_ROLE_CANCEL_ALARM, true); }
+  // The access-point macros through which Ecp code writes, reads, enters and leaves an
+  // access point (not to be confused with the application-partition entry and exit
+  // functions above), and the function that calls the ECU's service.
+  bool isApWriteMacro() const { return hasRole(KV_ROLE_AP_WRITE_MACRO); }
+  bool isApReadMacro() const { return hasRole(KV_ROLE_AP_READ_MACRO); }
+  bool isApEntryMacro() const { return hasRole(KV_ROLE_AP_ENTRY_MACRO); }
+  bool isApExitMacro() const { return hasRole(KV_ROLE_AP_EXIT_MACRO); }
+  bool isEcuServiceFunction() const { return hasRole(KV_ROLE_ECU_SERVICE_FUNCTION); }
+  void markAsApWriteMacro() { setRole(KV_ROLE_AP_WRITE_MACRO, true); }
+  void markAsApReadMacro() { setRole(KV_ROLE_AP_READ_MACRO, true); }
+  void markAsApEntryMacro() { setRole(KV_ROLE_AP_ENTRY_MACRO, true); }
+  void markAsApExitMacro() { setRole(KV_ROLE_AP_EXIT_MACRO, true); }
+  void markAsEcuServiceFunction() { setRole(KV_ROLE_ECU_SERVICE_FUNCTION, true); }
 
 protected:
   KvCSymbol(int index, WmCXString symbolName, KV_DataType* type);
 
 private:
+  friend class KvCCStmTable;   // records which table lists the symbol
+  friend class KvCSymbolQuery; // answers that table (getDestinationStt)
+
   WmCXString name;
   int debugIndex;
   KV_DataType* dataType;
@@ -104,6 +152,11 @@ private:
   mutable KvCExprLocDB db;
   unsigned roles = 0;
   bool selected = true;
+  tagKvESmbClassState extClassState = KV_SMBCLASS_STATE_NONE;
+  KvCSmbClassId* externClass = nullptr;
+  KvCCStmTable* stt = nullptr;
+  // The table whose entries list the symbol, or null.
+  KvCCStmTable* listedIn = nullptr;
 };
 
 #endif

@@ -12,6 +12,10 @@ KvCVarClassId* KvCVarClassServer::demandMacroGlobalExternDefault(const KvCSrcRef
   return demandVarClass("MacroGlobalExternDefault", true, true);
 }
 
+KvCVarClassId* KvCVarClassServer::demandSlLocalDefault(const KvCSrcRef* /*srcRef*/) {
+  return demandVarClass("SlLocalDefault", false, false);
+}
+
 KvCVarClassId* KvCVarClassServer::findVarClass(const WmCXString& name) const {
   auto it = classes.find(name);
   return it == classes.end() ? nullptr : it->second.get();

@@ -24,6 +24,10 @@ public:
   // The default class of the extern globals that macros and the RTOS interface use:
   // "MacroGlobalExternDefault", extern and global. `srcRef` is the caller's and is not kept.
   KvCVarClassId* demandMacroGlobalExternDefault(const KvCSrcRef* srcRef);
+  // The default class of local variables: "SlLocalDefault", neither extern nor global.
+  // Its variables belong to no file scope (the dummy arguments of macro calls, for one).
+  // `srcRef` is the caller's and is not kept (may be null).
+  KvCVarClassId* demandSlLocalDefault(const KvCSrcRef* srcRef);
   // The class of that name, or null.
   KvCVarClassId* findVarClass(const WmCXString& name) const;
 

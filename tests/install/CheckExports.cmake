@@ -24,7 +24,7 @@ foreach(_line IN LISTS _lines)
   endif()
   foreach(_forbidden "hulcv_detail" "WmCXString::" "KvCMessageServer::"
                      "KvCOptionValueStorage::" "KV_Dump::" "KvCDebugWmCXString"
-                     "KvCSubtreeWalk" "KvCELocDB")
+                     "KvCSubtreeWalk" "KvCELocDB" "KvCCvStructToolImpl")
     string(FIND "${_name}" "${_forbidden}" _at)
     if(_at EQUAL 0)
       message(FATAL_ERROR "exported but internal: ${_name}")
