@@ -46,54 +46,70 @@ bool KvCCStmTable::isSecondaryScopeTable() const {
   return isTopLevelTableOfFile(header) && header;
 }
 
-int KvCCStmTable::indexOf(const KvCSymbol* symbol) const {
-  for (std::size_t i = 0; symbol && i < entries.size(); ++i)
-    if (entries[i].symbol == symbol)
-      return static_cast<int>(i);
-  return -1;
+KvCCStmTable::Entry* KvCCStmTable::entryOf(const KvCSymbol* symbol) {
+  auto slot = slotOf.find(symbol);
+  return slot == slotOf.end() ? nullptr : &entries[slot->second];
 }
 
-void KvCCStmTable::dropEntry(int index) {
-  entries[static_cast<std::size_t>(index)].symbol->listedIn = nullptr;
-  entries.erase(entries.begin() + index);
+void KvCCStmTable::dropEntry(KvCSymbol* symbol) {
+  auto slot = slotOf.find(symbol);
+  if (slot == slotOf.end())
+    return;
+  entries[slot->second].symbol = nullptr;
+  slotOf.erase(slot);
+  byName.erase(symbol->getName().str());
+  symbol->listedIn = nullptr;
+}
+
+void KvCCStmTable::compact() const {
+  if (entries.size() == slotOf.size())
+    return;
+  std::size_t kept = 0;
+  for (const Entry& entry : entries) {
+    if (!entry.symbol)
+      continue;
+    slotOf[entry.symbol] = kept;
+    entries[kept++] = entry;
+  }
+  entries.resize(kept);
 }
 
 KvCSymbol* KvCCStmTable::getEnteredSymbol(int i) const {
   if (i < 0 || i >= getNumberOfEnteredSymbols())
     return nullptr;
+  compact();
   return entries[static_cast<std::size_t>(i)].symbol;
 }
 
 bool KvCCStmTable::isEnteredAsDefinition(int i) const {
   if (i < 0 || i >= getNumberOfEnteredSymbols())
     return false;
+  compact();
   return entries[static_cast<std::size_t>(i)].definition;
 }
 
 KvCSymbol* KvCCStmTable::findEnteredSymbol(const WmCXString& name) const {
-  for (const Entry& entry : entries)
-    if (entry.symbol->getName() == name)
-      return entry.symbol;
-  return nullptr;
+  auto held = byName.find(name.str());
+  return held == byName.end() ? nullptr : held->second;
 }
 
 bool KvCCStmTable::enter(KvCSymbol*& symbol, bool definition) {
   if (!symbol)
     return false;
-  int at = indexOf(symbol);
-  if (at < 0) {
-    if (KvCSymbol* held = findEnteredSymbol(symbol->getName())) {
-      // One object per name: the caller goes on with the held symbol, whose entry stays.
-      symbol = held;
-      entries[static_cast<std::size_t>(indexOf(held))].definition |= definition;
-      return true;
-    }
+  if (Entry* listed = entryOf(symbol)) {
+    listed->definition |= definition;
+  } else if (KvCSymbol* held = findEnteredSymbol(symbol->getName())) {
+    // One object per name: the caller goes on with the held symbol, whose entry stays.
+    symbol = held;
+    entryOf(held)->definition |= definition;
+    return true;
+  } else {
     if (KvCCStmTable* previous = symbol->listedIn)
-      previous->dropEntry(previous->indexOf(symbol));
+      previous->dropEntry(symbol);
+    slotOf.emplace(symbol, entries.size());
+    byName.emplace(symbol->getName().str(), symbol);
     entries.push_back(Entry{symbol, definition});
     symbol->listedIn = this;
-  } else {
-    entries[static_cast<std::size_t>(at)].definition |= definition;
   }
   if (KvCNameSpace* names = getNameSpace())
     names->add(symbol->getName());
@@ -106,9 +122,8 @@ bool KvCCStmTable::enterSymbol(KvCSymbol*& symbol) { return enter(symbol, true);
 bool KvCCStmTable::enterDeclaration(KvCSymbol*& symbol) { return enter(symbol, false); }
 
 bool KvCCStmTable::removeSymbol(KvCSymbol* symbol) {
-  const int at = indexOf(symbol);
-  if (at < 0)
+  if (!symbol || !entryOf(symbol))
     return false;
-  dropEntry(at);
+  dropEntry(symbol);
   return true;
 }

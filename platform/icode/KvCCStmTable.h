@@ -26,12 +26,17 @@
 // Every case but the first answers true. The potential-globals name space of the
 // sub-application is left alone. removeSymbol takes the symbol's entry out and nothing
 // else: the name stays in the name space and the symbol's getStt still names this table;
-// whoever moves the symbol clears those (KvCSmbDeclDefMover). Costs: O(entries).
+// whoever moves the symbol clears those (KvCSmbDeclDefMover). Costs: entering, removing
+// and finding by name or symbol are O(1) expected; the first indexed read after removals
+// closes the gaps they left, O(entries) once.
 #ifndef HUL_PLATFORM_ICODE_KVCCSTMTABLE_H
 #define HUL_PLATFORM_ICODE_KVCCSTMTABLE_H
 
 #include "platform/icode/KV_StatementTable.h"
 
+#include <cstddef>
+#include <string>
+#include <unordered_map>
 #include <vector>
 
 class KvCIcFileId;
@@ -71,14 +76,15 @@ public:
   virtual bool removeSymbol(KvCSymbol* symbol);
 
   // The listed symbols, in the order entered.
-  int getNumberOfEnteredSymbols() const { return static_cast<int>(entries.size()); }
+  int getNumberOfEnteredSymbols() const { return static_cast<int>(slotOf.size()); }
   KvCSymbol* getEnteredSymbol(int i) const;
   bool isEnteredAsDefinition(int i) const;
-  bool holdsSymbol(const KvCSymbol* symbol) const { return indexOf(symbol) >= 0; }
+  bool holdsSymbol(const KvCSymbol* symbol) const { return slotOf.count(symbol) != 0; }
   // The listed symbol of that name, or null.
   KvCSymbol* findEnteredSymbol(const WmCXString& name) const;
 
 private:
+  // An entry whose symbol is null is a gap left by a removal.
   struct Entry {
     KvCSymbol* symbol;
     bool definition;
@@ -89,13 +95,19 @@ private:
   // that file is a header.
   bool isTopLevelTableOfFile(bool& header) const;
   bool enter(KvCSymbol*& symbol, bool definition);
-  int indexOf(const KvCSymbol* symbol) const;
-  void dropEntry(int index);
+  // The slot of a listed symbol in `entries`, or null.
+  Entry* entryOf(const KvCSymbol* symbol);
+  void dropEntry(KvCSymbol* symbol);
+  // Closes the gaps, keeping the order entered, and renumbers the slots.
+  void compact() const;
 
   KvCParamSymbol* codeBlockSymbol = nullptr;
   KvCIcFileId* fileId = nullptr;
   KvCNameSpace* nameSpace = nullptr;
-  std::vector<Entry> entries;
+  // In the order entered, with gaps; the maps name the live entries only.
+  mutable std::vector<Entry> entries;
+  mutable std::unordered_map<const KvCSymbol*, std::size_t> slotOf;
+  std::unordered_map<std::string, KvCSymbol*> byName;
 };
 
 #endif

@@ -7,6 +7,7 @@
 #include "platform/icode/KV_ICodeFactoryContainer.h"
 #include "platform/icode/KV_QualifiedSymbolOp.h"
 #include "platform/icode/KV_SymbolDB.h"
+#include "platform/icode/KvCCStmTable.h"
 #include "platform/icode/KvCIcExprEqualitySpec.h"
 #include "platform/icode/KvCParamSymbol.h"
 #include "platform/icode/KvCUnparamSymbol.h"
@@ -331,3 +332,48 @@ TEST(SymbolDBTest, ParametrizedSymbolsInCreationOrderWithIncreasingDebugIndices)
 }
 
 } // namespace
+
+namespace {
+
+std::vector<std::string> listed(const KvCCStmTable* table) {
+  std::vector<std::string> names;
+  for (int i = 0; i < table->getNumberOfEnteredSymbols(); ++i)
+    names.push_back(table->getEnteredSymbol(i)->getName().str());
+  return names;
+}
+
+} // namespace
+
+// A table lists its symbols in the order entered, whatever was removed or moved away in
+// between, finds them by name, and keeps one symbol per name.
+TEST(StatementTableTest, ListsInEntryOrderThroughRemovalsMovesAndNameClashes) {
+  AppBuilder app;
+  KvCCStmTable* table = app.function("f").body().table();
+  KvCCStmTable* other = app.function("g").body().table();
+  std::vector<KvCUnparamSymbol*> v;
+  for (const char* name : {"a", "b", "c", "d"}) {
+    v.push_back(app.variable(name, app.int16(), false));
+    KvCSymbol* symbol = v.back();
+    EXPECT_TRUE(table->enterSymbol(symbol));
+  }
+  EXPECT_TRUE(table->removeSymbol(v[1]));
+  EXPECT_FALSE(table->removeSymbol(v[1]));
+  KvCSymbol* moved = v[2];
+  EXPECT_TRUE(other->enterSymbol(moved));
+  EXPECT_EQ(listed(table), (std::vector<std::string>{"a", "d"}));
+  EXPECT_EQ(table->findEnteredSymbol("b"), nullptr);
+  EXPECT_EQ(table->findEnteredSymbol("c"), nullptr);
+  EXPECT_EQ(other->findEnteredSymbol("c"), v[2]);
+
+  KvCSymbol* back = v[1];
+  EXPECT_TRUE(table->enterDeclaration(back));
+  EXPECT_EQ(listed(table), (std::vector<std::string>{"a", "d", "b"}));
+  EXPECT_TRUE(table->isEnteredAsDefinition(1));
+  EXPECT_FALSE(table->isEnteredAsDefinition(2));
+
+  KvCSymbol* clash = app.variable("a", app.int16(), false);
+  EXPECT_TRUE(table->enterDeclaration(clash));
+  EXPECT_EQ(clash, v[0]);
+  EXPECT_EQ(listed(table), (std::vector<std::string>{"a", "d", "b"}));
+  EXPECT_TRUE(table->isEnteredAsDefinition(0));
+}
