@@ -70,9 +70,11 @@ public:
   // view; nodes of earlier runs remain, and every function of the real graph has a node.
   // Sets the inlined-atomically marks of the real graph's function infos. Refused edges
   // (same step function, an existing edge not forced new) are only left out. False when
-  // not booted or the owned helpers are missing. The inherited construct(bool) stays
-  // reachable through the base class and builds the plain graph.
-  bool construct(); // NOLINT(clang-diagnostic-overloaded-virtual)
+  // not booted or the owned helpers are missing.
+  bool construct();
+  // The inherited construct(bool) stays visible beside it: it builds the graph from the
+  // ICode's calls as a function call graph does, not from the partitions.
+  using KvCFunctionCallGraph::construct;
   // Forgets real graph and view data, deletes every edge with its info, every node and the
   // node map; true.
   bool shutdown();
