@@ -155,54 +155,50 @@ KV_Operation* KvCEcpParamSymbolServer::createApEntryExitMacroBody(const WmCXStri
 
 // --- the access-point macros
 
-KvCParamSymbol* KvCEcpParamSymbolServer::demandApWriteMacro(const KvCSrcRef* srcRef) {
+KvCParamSymbol* KvCEcpParamSymbolServer::demandApReadWriteMacro(const WmCXString& name,
+                                                                const WmCXString& prefix,
+                                                                MarkOperation mark,
+                                                                const KvCSrcRef* srcRef) {
   if (!KV_VERIFY(isReady(), kErrorCode, __LINE__))
     return nullptr;
   WmCXString names[2] = {"arg1", "arg2"};
-  KV_Operation* body =
-      createApReadWriteMacroBody("ap_Write_", readWriteParamAccesses, names, srcRef);
+  KV_Operation* body = createApReadWriteMacroBody(prefix, readWriteParamAccesses, names, srcRef);
   KvCParamSymbol* macro =
-      demandAccesspointMacro("ap_Write", 2, readWriteParamAccesses, names, body, srcRef, false);
+      demandAccesspointMacro(name, 2, readWriteParamAccesses, names, body, srcRef, false);
   if (macro)
-    macro->markAsApWriteMacro();
+    (macro->*mark)();
   return macro;
+}
+
+KvCParamSymbol* KvCEcpParamSymbolServer::demandApEntryExitMacro(const WmCXString& name,
+                                                                const WmCXString& prefix,
+                                                                MarkOperation mark,
+                                                                const KvCSrcRef* srcRef) {
+  if (!KV_VERIFY(isReady(), kErrorCode, __LINE__))
+    return nullptr;
+  WmCXString names[1] = {"arg1"};
+  KV_Operation* body = createApEntryExitMacroBody(prefix, srcRef);
+  KvCParamSymbol* macro =
+      demandAccesspointMacro(name, 1, &entryExitParamAccess, names, body, srcRef, false);
+  if (macro)
+    (macro->*mark)();
+  return macro;
+}
+
+KvCParamSymbol* KvCEcpParamSymbolServer::demandApWriteMacro(const KvCSrcRef* srcRef) {
+  return demandApReadWriteMacro("ap_Write", "ap_Write_", &KvCSymbol::markAsApWriteMacro, srcRef);
 }
 
 KvCParamSymbol* KvCEcpParamSymbolServer::demandApReadMacro(const KvCSrcRef* srcRef) {
-  if (!KV_VERIFY(isReady(), kErrorCode, __LINE__))
-    return nullptr;
-  WmCXString names[2] = {"arg1", "arg2"};
-  KV_Operation* body =
-      createApReadWriteMacroBody("ap_Read_", readWriteParamAccesses, names, srcRef);
-  KvCParamSymbol* macro =
-      demandAccesspointMacro("ap_Read", 2, readWriteParamAccesses, names, body, srcRef, false);
-  if (macro)
-    macro->markAsApReadMacro();
-  return macro;
+  return demandApReadWriteMacro("ap_Read", "ap_Read_", &KvCSymbol::markAsApReadMacro, srcRef);
 }
 
 KvCParamSymbol* KvCEcpParamSymbolServer::demandApEntryMacro(const KvCSrcRef* srcRef) {
-  if (!KV_VERIFY(isReady(), kErrorCode, __LINE__))
-    return nullptr;
-  WmCXString names[1] = {"arg1"};
-  KV_Operation* body = createApEntryExitMacroBody("ap_Entry_", srcRef);
-  KvCParamSymbol* macro =
-      demandAccesspointMacro("ap_Entry", 1, &entryExitParamAccess, names, body, srcRef, false);
-  if (macro)
-    macro->markAsApEntryMacro();
-  return macro;
+  return demandApEntryExitMacro("ap_Entry", "ap_Entry_", &KvCSymbol::markAsApEntryMacro, srcRef);
 }
 
 KvCParamSymbol* KvCEcpParamSymbolServer::demandApExitMacro(const KvCSrcRef* srcRef) {
-  if (!KV_VERIFY(isReady(), kErrorCode, __LINE__))
-    return nullptr;
-  WmCXString names[1] = {"arg1"};
-  KV_Operation* body = createApEntryExitMacroBody("ap_Exit_", srcRef);
-  KvCParamSymbol* macro =
-      demandAccesspointMacro("ap_Exit", 1, &entryExitParamAccess, names, body, srcRef, false);
-  if (macro)
-    macro->markAsApExitMacro();
-  return macro;
+  return demandApEntryExitMacro("ap_Exit", "ap_Exit_", &KvCSymbol::markAsApExitMacro, srcRef);
 }
 
 // --- the auxiliary macros

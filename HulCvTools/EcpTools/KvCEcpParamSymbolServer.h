@@ -92,6 +92,14 @@ private:
   // every call of the body uses the macro parameter accesses.
   KV_Operation* createApReadWriteMacroBody(const WmCXString& prefix, KV_ParamAccess** accesses,
                                            WmCXString* names, const KvCSrcRef* srcRef);
+  // One of the role marks of a symbol (markAsApWriteMacro and its kin).
+  using MarkOperation = void (KvCSymbol::*)();
+  // ap_Write and ap_Read: the macro `name` over the body with `prefix`, marked by `mark`.
+  KvCParamSymbol* demandApReadWriteMacro(const WmCXString& name, const WmCXString& prefix,
+                                         MarkOperation mark, const KvCSrcRef* srcRef);
+  // ap_Entry and ap_Exit, the same way.
+  KvCParamSymbol* demandApEntryExitMacro(const WmCXString& name, const WmCXString& prefix,
+                                         MarkOperation mark, const KvCSrcRef* srcRef);
   // The body of ap_Entry and ap_Exit: AP_CONCAT(<prefix>, arg1) followed by "()".
   KV_Operation* createApEntryExitMacroBody(const WmCXString& prefix, const KvCSrcRef* srcRef);
   // Whether boot ran and made everything a demand needs.

@@ -55,15 +55,8 @@ bool KvCSmbDeclDefMover::moveSymbol(KvCSymbol* symbol, KvCCStmTable* from, KvCCS
 
 bool KvCSmbDeclDefMover::moveLocalVar(KvCSymbol* symbol, KvCCStmTable* from, KvCCStmTable* to,
                                       bool& moved) {
-  moved = false;
-  if (!symbol || !from || !to || !symbol->getSmbClassId() || !isVariableOrFunction(symbol))
-    return true;
-  from->removeSymbol(symbol);
-  clearSymbolEntries(symbol);
-  KvCSymbol* entered = symbol;
-  to->enterSymbol(entered);
-  moved = true;
-  return true;
+  // The symbol's own class, read before the move: the move keeps it.
+  return moveSymbol(symbol, from, to, symbol ? symbol->getSmbClassId() : nullptr, false, moved);
 }
 
 bool KvCSmbDeclDefMover::moveLocalVar(KvCSymbol* symbol, KvCCStmTable* from, KvCCStmTable* to) {

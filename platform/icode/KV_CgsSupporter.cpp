@@ -7,6 +7,8 @@
 #include "platform/icode/KV_Operation.h"
 #include "platform/icode/KV_Statement.h"
 #include "platform/icode/KV_SymbolDB.h"
+#include "platform/icode/KV_SymbolServer.h"
+#include "platform/icode/KV_VariableSymbolServer.h"
 #include "platform/icode/KvCCStmTable.h"
 #include "platform/icode/KvCCodeViewData.h"
 #include "platform/icode/KvCParamSymbol.h"
@@ -34,9 +36,7 @@ bool isCKeyword(const WmCXString& name) {
   return false;
 }
 
-bool isFileScope(const KvCCStmTable* table) {
-  return table && table->getFile() && !table->getParentStatement() && !table->getCodeBlockSymbol();
-}
+bool isFileScope(const KvCCStmTable* table) { return table && table->isFileScopeTable(); }
 } // namespace
 
 KV_CgsSupporter::~KV_CgsSupporter() = default;
@@ -61,12 +61,10 @@ KvCUnparamSymbol* KV_CgsSupporter::createGlobalVariable(const WmCXString& name, 
     return nullptr;
   KV_ICodeFactoryContainer* factories = codeViewData->getFactoryContainer();
   KV_ExprLocFactory* locations = factories->getExprLocFactory();
-  KvCUnparamSymbol* variable = codeViewData->getSymbolDB()->createUnparamSymbol(name, type, false);
-  variable->setScaling(scaling);
-  variable->setVarClass(varClass);
-  for (unsigned bit = 1; bit != 0; bit <<= 1)
-    if (roles & bit)
-      variable->setRole(static_cast<tagKvESymbolRole>(bit), true);
+  KvCUnparamSymbol* variable = factories->getSymbolServer()->getVariable()->create(
+      name, roles, type, scaling, varClass, nullptr);
+  if (!variable)
+    return nullptr;
 
   // (object, type, file) and, for a definition, the initial value. Fresh locations and a
   // fresh statement: the factories cannot refuse them.

@@ -57,9 +57,7 @@ KvCUnparamSymbol* KV_MacroSymbolServer::demandGlobal(KvCCStmTable* table, const 
                       macro.symbol->getScaling() == scaling;
     return same ? macro.symbol : nullptr;
   }
-  const bool fileScope =
-      table->getFile() && !table->getParentStatement() && !table->getCodeBlockSymbol();
-  if (!fileScope || !cgsSupporter->isNameFree(table, name))
+  if (!table->isFileScopeTable() || !cgsSupporter->isNameFree(table, name))
     return nullptr;
   KV_ICodeFactoryContainer* factories = codeViewData->getFactoryContainer();
   KV_ExprLocFactory* locations = factories->getExprLocFactory();

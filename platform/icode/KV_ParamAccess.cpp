@@ -2,30 +2,6 @@
 
 #include "platform/support/KvCMemController.h"
 
-#include <cstddef>
-#include <cstdlib>
+void* KV_ParamAccess::operator new(std::size_t size) noexcept { return kvAllocModelObject(size); }
 
-namespace {
-// Each block starts with the controller that gave it (null: the C heap).
-constexpr std::size_t kHeader = alignof(std::max_align_t);
-} // namespace
-
-void* KV_ParamAccess::operator new(std::size_t size) noexcept {
-  KvCMemController* controller = pKVMemory;
-  void* block = controller ? controller->allocMemBlock(size + kHeader) : std::malloc(size + kHeader);
-  if (!block)
-    return nullptr;
-  *static_cast<KvCMemController**>(block) = controller;
-  return static_cast<unsigned char*>(block) + kHeader;
-}
-
-void KV_ParamAccess::operator delete(void* object) noexcept {
-  if (!object)
-    return;
-  void* block = static_cast<unsigned char*>(object) - kHeader;
-  KvCMemController* controller = *static_cast<KvCMemController**>(block);
-  if (controller)
-    controller->freeMemBlock(block);
-  else
-    std::free(block);
-}
+void KV_ParamAccess::operator delete(void* object) noexcept { kvFreeModelObject(object); }

@@ -16,9 +16,7 @@
 #include <vector>
 
 namespace {
-bool isFileScope(const KvCCStmTable* table) {
-  return table && table->getFile() && !table->getParentStatement() && !table->getCodeBlockSymbol();
-}
+bool isFileScope(const KvCCStmTable* table) { return table && table->isFileScopeTable(); }
 
 bool validNames(int n, const WmCXString* names) {
   if (n > 0 && !names)

@@ -16,6 +16,5 @@ KvCUnparamSymbol* KV_VariableSymbolServer::create(const WmCXString& name, unsign
   for (unsigned bit = 1; bit != 0; bit <<= 1)
     if (roles & bit)
       variable->setRole(static_cast<tagKvESymbolRole>(bit), true);
-  ++created;
   return variable;
 }

@@ -30,12 +30,9 @@ public:
   // empty name or a null type or class. `srcRef` is the caller's and is not kept.
   KvCUnparamSymbol* create(const WmCXString& name, unsigned int roles, KV_DataType* type,
                            KV_Scaling* scaling, KvCVarClassId* varClass, const KvCSrcRef* srcRef);
-  // The number of variables this server made.
-  int getNumberOfCreated() const { return created; }
 
 private:
   KvCCodeViewData* codeViewData;
-  int created = 0;
 };
 
 #endif

@@ -26,6 +26,10 @@ KvCIcFileId* KvCCStmTable::getFile() const {
   return nullptr;
 }
 
+bool KvCCStmTable::isFileScopeTable() const {
+  return getFile() && !getParentStatement() && !getCodeBlockSymbol();
+}
+
 bool KvCCStmTable::isTopLevelTableOfFile(bool& header) const {
   header = false;
   KvCIcFileId* id = getFile();

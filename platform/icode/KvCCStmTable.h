@@ -65,6 +65,9 @@ public:
   virtual KvCNameSpace* getNameSpace() const { return nameSpace; }
   void setNameSpace(KvCNameSpace* names) { nameSpace = names; }
 
+  // The table holds a file's globals: it names a file and lies outside every statement and
+  // function body.
+  bool isFileScopeTable() const;
   // The scope kinds (see above).
   virtual bool isPrimaryScopeTable() const;
   virtual bool isSecondaryScopeTable() const;

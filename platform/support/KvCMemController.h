@@ -28,4 +28,11 @@ public:
 // generator (or a test) while no object taken from the old controller is alive.
 extern HUL_PLATFORM_API KvCMemController* pKVMemory;
 
+// Storage for the model's own heap objects (their operator new/delete): a block of
+// `size` bytes from `pKVMemory`, or from the C heap when none is set, that remembers
+// where it came from, so it goes back there even when the controller has changed since.
+// Null when no memory is left; freeing null is ignored.
+HUL_PLATFORM_API void* kvAllocModelObject(std::size_t size) noexcept;
+HUL_PLATFORM_API void kvFreeModelObject(void* object) noexcept;
+
 #endif

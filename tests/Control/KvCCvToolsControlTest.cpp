@@ -3,6 +3,7 @@
 #include "HulCvTools/Control/KvCCvToolsOptionsInterface.h"
 #include "platform/support/KvCCountingMemController.h"
 #include "platform/support/KvCOptionValueStorage.h"
+#include "tests/CountingMemory.h"
 
 #include <gtest/gtest.h>
 
@@ -13,14 +14,6 @@ namespace {
 static_assert(!std::is_copy_constructible_v<KvCCvToolsControl>);
 static_assert(!std::is_copy_assignable_v<KvCCvToolsControl>);
 static_assert(!std::is_copy_assignable_v<KvCCvToolsEnv>);
-
-// Installs a counting memory controller for the scope of a test.
-class CountingMemory {
-public:
-  CountingMemory() { pKVMemory = &controller; }
-  ~CountingMemory() { pKVMemory = nullptr; }
-  KvCCountingMemController controller;
-};
 
 const KvCCvToolsOptionsInterface& optionsOf(const KvCCvToolsControl& control) {
   return *control.getEnv()->getOptionsInterface();

@@ -34,6 +34,7 @@
 #include "platform/support/KvCCountingMemController.h"
 #include "platform/support/KvCMemController.h"
 #include "platform/support/KvCMessageServer.h"
+#include "tests/CountingMemory.h"
 
 #include <gtest/gtest.h>
 
@@ -45,16 +46,6 @@ namespace {
 KvCMessageServer& messages() { return *KvCMessageServer::getMessageServer(); }
 
 using Demand = KvCParamSymbol* (KvCEcpParamSymbolServer::*)(const KvCSrcRef*);
-
-// Installs a counting memory controller for the scope.
-class CountingMemory {
-public:
-  CountingMemory() { pKVMemory = &controller; }
-  ~CountingMemory() { pKVMemory = nullptr; }
-  CountingMemory(const CountingMemory&) = delete;
-  CountingMemory& operator=(const CountingMemory&) = delete;
-  KvCCountingMemController controller;
-};
 
 class EcpParamSymbolServerTest : public ::testing::Test {
 protected:

@@ -1,4 +1,5 @@
 #include "HulCvTools/InlineSymbolDb/KvCInlineSymbolDb.h"
+#include "tests/CountingMemory.h"
 
 #include "platform/icode/KvCUnparamSymbol.h"
 #include "platform/support/KvCCountingMemController.h"
@@ -18,7 +19,9 @@ using Checks = std::vector<std::string>;
 class InlineSymbolDbTest : public InlineSymbolDbFixture {
 protected:
   // Point { x, y }
-  KV_StructType* point() { return app.structType("Point", {{"x", app.int16()}, {"y", app.int16()}}); }
+  KV_StructType* point() {
+    return app.structType("Point", {{"x", app.int16()}, {"y", app.int16()}});
+  }
   // Outer { a, in: Inner { p, q }, b }
   KV_StructType* outer() {
     KV_StructType* inner = app.structType("Inner", {{"p", app.int16()}, {"q", app.int32()}});
@@ -276,15 +279,6 @@ TEST_F(InlineSymbolDbTest, CopiesAreDeepAndOutliveTheOriginal) {
 }
 
 // --- memory
-
-class CountingMemory {
-public:
-  CountingMemory() { pKVMemory = &controller; }
-  ~CountingMemory() { pKVMemory = nullptr; }
-  CountingMemory(const CountingMemory&) = delete;
-  CountingMemory& operator=(const CountingMemory&) = delete;
-  KvCCountingMemController controller;
-};
 
 TEST_F(InlineSymbolDbTest, EveryBlockGoesBackAfterDestructionOfDatabaseAndCopies) {
   KvCUnparamSymbol* s = app.structVariable("s", outer());
